@@ -1,15 +1,21 @@
 # A room is a folder of src/ built as one static library. It finds its own headers and those of the rooms that
-# it links, and no others: each room's headers are reached through a folder that holds a link to that room
-# alone, so an include against the arrows does not build.
+# it links, and no others: each room's headers are reached through a folder that holds links to that room's
+# headers alone, so an include against the arrows does not build.
 #
 #   quabble_room(engine SOURCES board.cpp ... ROOMS base LIBRARIES PkgConfig::X)
+#
+# The room platform_sdl is the folder platform/sdl.
 function(quabble_room name)
   cmake_parse_arguments(ARG "" "" "SOURCES;ROOMS;LIBRARIES" ${ARGN})
+  string(REPLACE "_" "/" folder ${name})
   set(door ${CMAKE_BINARY_DIR}/rooms/${name})
-  string(REPLACE "_" "/" folder ${name})  # platform_sdl is platform/sdl
-  get_filename_component(parent ${folder} DIRECTORY)
-  file(MAKE_DIRECTORY ${door}/${parent})
-  file(CREATE_LINK ${CMAKE_SOURCE_DIR}/src/${folder} ${door}/${folder} SYMBOLIC)
+  file(REMOVE_RECURSE ${door})
+  file(MAKE_DIRECTORY ${door}/${folder})
+  file(GLOB headers CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/src/${folder}/*.hpp)
+  foreach(header ${headers})
+    get_filename_component(file ${header} NAME)
+    file(CREATE_LINK ${header} ${door}/${folder}/${file} SYMBOLIC)
+  endforeach()
   list(TRANSFORM ARG_SOURCES PREPEND ${CMAKE_SOURCE_DIR}/src/${folder}/)
   add_library(${name} STATIC ${ARG_SOURCES})
   target_include_directories(${name} PUBLIC ${door})

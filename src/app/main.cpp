@@ -1,0 +1,23 @@
+#include <chrono>
+#include <cstdio>
+#include <cstdlib>
+#include <string>
+
+#include "app/program.hpp"
+#include "platform/sdl/sdl_front_end.hpp"
+
+int main() {
+    std::string problem;
+    const auto frontEnd = quabble::SdlFrontEnd::open(problem);
+    if (!frontEnd) {
+        std::fprintf(stderr, "Quabble needs a graphical display to open its window on (%s).\n", problem.c_str());
+        return EXIT_FAILURE;
+    }
+    const auto clock = std::chrono::system_clock::now().time_since_epoch().count();
+    quabble::MessageLoop loop(*frontEnd);
+    quabble::AppState app(loop, static_cast<std::uint64_t>(clock));
+    quabble::Task<> program = quabble::runProgram(app);
+    program.start();
+    frontEnd->run(loop);
+    return EXIT_SUCCESS;
+}

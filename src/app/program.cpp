@@ -1,0 +1,30 @@
+#include "app/program.hpp"
+
+#include <filesystem>
+
+namespace quabble {
+namespace {
+
+constexpr char folderSeparator = static_cast<char>(std::filesystem::path::preferred_separator);
+
+std::string withSeparator(std::string folder) {
+    if (folder.empty() || folder.back() != folderSeparator)
+        folder += folderSeparator;
+    return folder;
+}
+
+void Main(AppState& app) {
+    app.programFolder = withSeparator(app.loop.frontEnd().executableFolder());
+    app.pictures = loadGraphics(app.programFolder);
+    app.frmQuabble().show();
+    app.frmQuabble().showMainMenu();
+}
+
+}  // namespace
+
+Task<> runProgram(AppState& app) {
+    Main(app);
+    co_await app.loop.run();
+}
+
+}  // namespace quabble

@@ -1,0 +1,102 @@
+#include "gfx/result_dialog.hpp"
+
+#include "base/round_half_even.hpp"
+#include "engine/level_table.hpp"
+#include "gfx/message_template.hpp"
+#include "gfx/painters.hpp"
+#include "gfx/string_table.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr Size designedSize{457, 265};
+constexpr Font textFont{Typeface::Sans, 12};
+constexpr Font buttonFont{Typeface::Sans, 14};
+
+std::string figures(std::uint16_t templateId, const GameStats& stats, std::int32_t level) {
+    return fillTemplate(templateId, {"|1", stats.score, "|2", level, "|3", stats.blocksCleared, "|4",
+                                     stats.largestCluster});
+}
+
+std::string titled(std::uint16_t titleId, const std::string& body) {
+    return std::string(loadString(titleId)) + "\r\n" + body;
+}
+
+}  // namespace
+
+std::string resultText(const GameState& game, bool goNextLevel) {
+    const GameStats& stats = game.stats;
+    if (game.gameMode == GameMode::Training)
+        return titled(string_ids::gameOver, figures(string_ids::trainingResult, stats, stats.level));
+    const bool allCompleted = stats.level > lastLevel || (stats.level == lastLevel && goNextLevel);
+    if (allCompleted && game.gameMode == GameMode::Timed)
+        return std::string(loadString(string_ids::allLevelsFinished));
+    if (allCompleted)
+        return titled(string_ids::allLevelsFinished, figures(string_ids::arcadeResult, stats, stats.level));
+    if (goNextLevel)
+        return titled(string_ids::levelCompleted, figures(string_ids::levelResult, stats, stats.level + 1));
+    return titled(string_ids::gameOver, figures(string_ids::arcadeResult, stats, stats.level));
+}
+
+ResultDialog::ResultDialog(MessageLoop& loop, Window& owner, const GameState& game, std::int16_t layoutUnit)
+    : Window(loop, &owner), game_(game), layoutUnit_(layoutUnit) {}
+
+void ResultDialog::Form_Load() {
+    setCaption("Game Statistics");
+    setClientSize(designedSize);
+    layOut();
+    fillBox(frameBox_);
+    canvas().font = textFont;
+    drawShadowText(statsBox_, 2, resultText(game_, goNextLevel), text_format::centre);
+    okBox_.hovered = false;
+    drawOkButton();
+}
+
+void ResultDialog::layOut() {
+    const std::int32_t u = layoutUnit_;
+    const auto [width, height] = outerSize();
+    frameBox_ = {.surface = &canvas(), .width = width, .height = height, .fillBrush = palette::blackBrush};
+    statsBox_ = {.surface = &canvas(),
+                 .left = u,
+                 .top = u,
+                 .width = width - 2 * u,
+                 .height = height - 4 * u,
+                 .textColour = palette::panelTextColour};
+    okBox_ = {.surface = &canvas(),
+              .left = roundHalfEven((width - 2 * u) / 2.0),
+              .top = height - 2 * u,
+              .width = 2 * u,
+              .height = 30,
+              .fillBrush = palette::backgroundBrush,
+              .framePen = palette::outlinePen,
+              .textColour = palette::panelTextColour};
+}
+
+void ResultDialog::drawOkButton() {
+    canvas().font = buttonFont;
+    const BoxStyle style = okBox_.hovered ? BoxStyle::DoubleFramed : BoxStyle::Framed;
+    drawLabelledBox(okBox_, style, okBox_.hovered, okBox_.hovered ? 8 : 6, loadString(string_ids::ok));
+}
+
+Task<> ResultDialog::Form_MouseDown(float x, float y) {
+    if (hitTest(okBox_, x, y))
+        unload();
+    co_return;
+}
+
+Task<> ResultDialog::Form_MouseMove(float x, float y) {
+    const bool over = hitTest(okBox_, x, y);
+    if (over == okBox_.hovered)
+        co_return;
+    okBox_.hovered = over;
+    drawOkButton();
+    refresh();
+}
+
+Task<> ResultDialog::Form_KeyPress(std::int16_t key) {
+    if (key == keys::enter || key == keys::escape)
+        unload();
+    co_return;
+}
+
+}  // namespace quabble

@@ -1,0 +1,14 @@
+#pragma once
+
+#include "platform/surface.hpp"
+#include "platform/text.hpp"
+
+namespace quabble {
+
+// A window's drawing surface: its picture and the font that texts are drawn with.
+struct Canvas {
+    Surface picture;
+    Font font;
+};
+
+}  // namespace quabble

@@ -1,0 +1,49 @@
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+#include <optional>
+#include <string>
+
+#include "platform/geometry.hpp"
+#include "platform/surface.hpp"
+
+namespace quabble {
+
+using Clock = std::chrono::steady_clock;
+using TimePoint = Clock::time_point;
+using std::chrono::milliseconds;
+
+enum class WindowId : std::uint32_t { none = 0 };
+
+// What a native window is made from. It never changes its size.
+struct NativeWindow {
+    std::string caption;            // UTF-8
+    Size clientSize;                // what the program paints
+    std::optional<Point> position;  // of its outer frame; without one, centred on its owner or the screen
+    WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner and centres on it
+};
+
+// The machine that the program runs on, seen from the program: what a port has to write. Everything is called
+// on the one thread of the program. Operations with a body here may be left out by a machine that lacks them.
+class FrontEnd {
+ public:
+    virtual ~FrontEnd() = default;
+
+    virtual TimePoint now() = 0;
+
+    // Makes a window and shows it; it is black until its first pixels come.
+    virtual void createWindow(WindowId window, const NativeWindow& traits) = 0;
+    // Shows the picture, of the window's client size, and keeps it: when the window is uncovered or restored the
+    // front end shows it again by itself.
+    virtual void showPixels(WindowId window, const Surface& picture) = 0;
+    virtual void closeWindow(WindowId window) = 0;
+    // Asks for the window to be minimised; an event reports when it is.
+    virtual void minimiseWindow(WindowId /*window*/) {}
+    virtual Size screenSize() { return {1024, 768}; }
+
+    // The folder of the running program, without a separator at its end.
+    virtual std::string executableFolder() = 0;
+};
+
+}  // namespace quabble

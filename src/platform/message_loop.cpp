@@ -1,0 +1,132 @@
+#include "platform/message_loop.hpp"
+
+#include <algorithm>
+#include <cassert>
+#include <utility>
+
+#include "platform/timer.hpp"
+#include "platform/window.hpp"
+
+namespace quabble {
+
+Task<> MessageLoop::runPendingMessages() {
+    while (hasMessage())
+        co_await deliverOne();
+    co_await pause(milliseconds::zero());  // which does not come back once the program has ended
+}
+
+Task<> MessageLoop::showModal(Window& window) {
+    window.show();
+    modalWindows_.push_back(&window);
+    while (window.isShown()) {
+        co_await nextMessage();
+        co_await deliverOne();
+    }
+    std::erase(modalWindows_, &window);
+    co_await pause(milliseconds::zero());
+}
+
+Task<> MessageLoop::run() {
+    while (true) {
+        co_await nextMessage();
+        co_await deliverOne();
+    }
+}
+
+void MessageLoop::post(const InputEvent& event) {
+    const bool supersedes = event.kind == EventKind::MouseMove && !events_.empty() &&
+                            events_.back().kind == EventKind::MouseMove && events_.back().window == event.window;
+    if (supersedes)
+        events_.back() = event;
+    else
+        events_.push_back(event);
+}
+
+void MessageLoop::wake() {
+    while (program_ && isOver(programWaitsUntil_))
+        std::exchange(program_, {}).resume();
+}
+
+std::optional<TimePoint> MessageLoop::nextDeadline() const {
+    if (ended_ || !program_)
+        return std::nullopt;
+    if (programWaitsUntil_)
+        return programWaitsUntil_;
+    if (!events_.empty())
+        return frontEnd_.now();
+    std::optional<TimePoint> earliest;
+    for (const Timer* timer : timers_) {
+        const auto due = timer->nextDue();
+        if (due && (!earliest || *due < *earliest))
+            earliest = due;
+    }
+    return earliest;
+}
+
+void MessageLoop::requestEnd() {
+    const auto main = std::find_if(windows_.rbegin(), windows_.rend(), [](const Window* window) {
+        return window->isShown() && !window->isDialog();
+    });
+    if (main != windows_.rend())
+        (*main)->unload();
+    end();
+}
+
+bool MessageLoop::isOver(std::optional<TimePoint> wait) const {
+    if (ended_)
+        return false;
+    return wait ? frontEnd_.now() >= *wait : hasMessage();
+}
+
+bool MessageLoop::hasMessage() const { return !ended_ && (!events_.empty() || firstDueTimer() != nullptr); }
+
+Timer* MessageLoop::firstDueTimer() const {
+    Timer* first = nullptr;
+    for (Timer* timer : timers_) {
+        const auto due = timer->nextDue();
+        if (due && *due <= frontEnd_.now() && (first == nullptr || *due < *first->nextDue()))
+            first = timer;
+    }
+    return first;
+}
+
+// What the player did comes before the timers' ticks.
+Task<> MessageLoop::deliverOne() {
+    if (!events_.empty()) {
+        const InputEvent event = events_.front();
+        events_.pop_front();
+        co_await deliver(event);
+    } else if (Timer* timer = firstDueTimer()) {
+        co_await timer->tick();
+    }
+}
+
+Task<> MessageLoop::deliver(InputEvent event) {
+    Window* window = findWindow(event.window);
+    if (window == nullptr || !window->isShown())
+        co_return;
+    const bool isInput = event.kind != EventKind::Minimised && event.kind != EventKind::Restored;
+    if (isInput && modalWindow() != nullptr && modalWindow() != window)
+        co_return;
+    co_await window->handle(event);
+}
+
+Window* MessageLoop::findWindow(WindowId id) const {
+    const auto found = std::find_if(windows_.begin(), windows_.end(),
+                                    [&](const Window* window) { return window->id() == id; });
+    return found == windows_.end() ? nullptr : *found;
+}
+
+MessageLoop::Wait::~Wait() {
+    if (suspended)
+        loop.program_ = {};
+}
+
+void MessageLoop::Wait::await_suspend(std::coroutine_handle<> program) {
+    assert(!loop.program_);
+    loop.program_ = program;
+    loop.programWaitsUntil_ = until;
+    suspended = true;
+}
+
+}  // namespace quabble

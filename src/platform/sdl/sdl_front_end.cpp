@@ -1,0 +1,195 @@
+#include "platform/sdl/sdl_front_end.hpp"
+
+#include <SDL2/SDL.h>
+
+#include <algorithm>
+#include <csignal>
+#include <cstring>
+#include <filesystem>
+
+#include "platform/sdl/sdl_events.hpp"
+
+namespace quabble {
+namespace {
+
+// The terminal's end asks the process to end like any other request; SDL turns SIGTERM into an event.
+extern "C" void passOnHangUp(int) { std::raise(SIGTERM); }
+
+}  // namespace
+
+// A window of the desktop and the picture it shows.
+class SdlFrontEnd::DesktopWindow {
+ public:
+    DesktopWindow(const NativeWindow& traits, Point position, SDL_Window* owner)
+        : window_(SDL_CreateWindow(traits.caption.c_str(), position.x, position.y, traits.clientSize.width,
+                                   traits.clientSize.height, owner == nullptr ? 0U : Uint32{SDL_WINDOW_SKIP_TASKBAR})) {
+        if (owner != nullptr && window_ != nullptr)
+            SDL_SetWindowModalFor(window_, owner);
+    }
+    ~DesktopWindow() {
+        if (window_ != nullptr)
+            SDL_DestroyWindow(window_);
+    }
+    DesktopWindow(const DesktopWindow&) = delete;
+    DesktopWindow& operator=(const DesktopWindow&) = delete;
+
+    SDL_Window* sdl() const { return window_; }
+
+    void show(const Surface& picture) {
+        picture_ = picture;
+        showAgain();
+    }
+
+    // A window that was uncovered, restored or resized gets its picture again.
+    void showAgain() {
+        SDL_Surface* screen = window_ == nullptr ? nullptr : SDL_GetWindowSurface(window_);
+        if (screen == nullptr)
+            return;
+        const bool direct = screen->format->BytesPerPixel == 4 && screen->format->Rmask == 0xFF0000 &&
+                            screen->format->Gmask == 0xFF00 && screen->format->Bmask == 0xFF;
+        if (direct)
+            copyTo(*screen);
+        else
+            convertTo(*screen);
+        SDL_UpdateWindowSurface(window_);
+    }
+
+ private:
+    void copyTo(SDL_Surface& screen) const {
+        const auto width = static_cast<std::size_t>(std::min(screen.w, picture_.width()));
+        for (std::int32_t y = 0; y < std::min(screen.h, picture_.height()); ++y) {
+            auto* line = static_cast<std::byte*>(screen.pixels) + std::ptrdiff_t{y} * screen.pitch;
+            std::memcpy(line, picture_.row(y).data(), width * sizeof(std::uint32_t));
+        }
+    }
+
+    void convertTo(SDL_Surface& screen) {
+        if (picture_.isEmpty())
+            return;
+        SDL_Surface* source = SDL_CreateRGBSurfaceWithFormatFrom(
+            picture_.row(0).data(), picture_.width(), picture_.height(), 32,
+            picture_.width() * static_cast<int>(sizeof(std::uint32_t)), SDL_PIXELFORMAT_RGB888);
+        if (source == nullptr)
+            return;
+        SDL_BlitSurface(source, nullptr, &screen, nullptr);
+        SDL_FreeSurface(source);
+    }
+
+    SDL_Window* window_;
+    Surface picture_;
+};
+
+std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
+    // A window surface drawn by the processor opens at once; by way of OpenGL it takes many times as long.
+    SDL_SetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0");
+    SDL_SetHint(SDL_HINT_QUIT_ON_LAST_WINDOW_CLOSE, "0");
+    SDL_SetHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
+    SDL_SetHint(SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1");
+    SDL_SetHint(SDL_HINT_APP_NAME, "quabble");
+    SDL_SetHint("SDL_VIDEO_X11_WMCLASS", "quabble");
+    if (SDL_Init(SDL_INIT_VIDEO) != 0) {
+        problem = SDL_GetError();
+        return nullptr;
+    }
+    SDL_EnableScreenSaver();
+    std::signal(SIGHUP, passOnHangUp);
+    return std::unique_ptr<SdlFrontEnd>(new SdlFrontEnd);
+}
+
+SdlFrontEnd::~SdlFrontEnd() {
+    windows_.clear();
+    SDL_Quit();
+}
+
+void SdlFrontEnd::run(MessageLoop& loop) {
+    loop.wake();
+    while (!loop.ended()) {
+        waitForEvents(loop);
+        loop.wake();
+    }
+}
+
+// Blocks until something has happened or the program's wait is over, then posts all that has happened.
+void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
+    SDL_Event event;
+    const auto deadline = loop.nextDeadline();
+    int any = 0;
+    if (deadline) {
+        const auto left = std::chrono::ceil<milliseconds>(*deadline - now());
+        any = SDL_WaitEventTimeout(&event, static_cast<int>(std::max<std::int64_t>(left.count(), 0)));
+    } else {
+        any = SDL_WaitEvent(&event);
+    }
+    for (; any != 0; any = SDL_PollEvent(&event)) {
+        if (event.type == SDL_QUIT) {
+            loop.requestEnd();
+            return;
+        }
+        const WindowId window = idOf(windowOf(event));
+        if (event.type == SDL_WINDOWEVENT &&
+            (event.window.event == SDL_WINDOWEVENT_EXPOSED || event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED)) {
+            if (DesktopWindow* shown = find(window))
+                shown->showAgain();
+        }
+        if (auto input = translate(event)) {
+            input->window = window;
+            loop.post(*input);
+        }
+    }
+}
+
+void SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
+    const DesktopWindow* owner = find(traits.owner);
+    windows_[window] =
+        std::make_unique<DesktopWindow>(traits, placeOf(traits), owner == nullptr ? nullptr : owner->sdl());
+}
+
+Point SdlFrontEnd::placeOf(const NativeWindow& traits) {
+    if (traits.position)
+        return *traits.position;
+    const DesktopWindow* owner = find(traits.owner);
+    if (owner == nullptr)
+        return {static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED), static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED)};
+    Rect area;
+    SDL_GetWindowPosition(owner->sdl(), &area.left, &area.top);
+    SDL_GetWindowSize(owner->sdl(), &area.right, &area.bottom);
+    return {area.left + (area.right - traits.clientSize.width) / 2,
+            area.top + (area.bottom - traits.clientSize.height) / 2};
+}
+
+void SdlFrontEnd::showPixels(WindowId window, const Surface& picture) {
+    if (DesktopWindow* shown = find(window))
+        shown->show(picture);
+}
+
+void SdlFrontEnd::closeWindow(WindowId window) { windows_.erase(window); }
+
+void SdlFrontEnd::minimiseWindow(WindowId window) {
+    if (const DesktopWindow* shown = find(window))
+        SDL_MinimizeWindow(shown->sdl());
+}
+
+Size SdlFrontEnd::screenSize() {
+    SDL_Rect bounds{};
+    SDL_GetDisplayBounds(0, &bounds);
+    return {bounds.w, bounds.h};
+}
+
+std::string SdlFrontEnd::executableFolder() {
+    std::error_code unknown;
+    return std::filesystem::read_symlink("/proc/self/exe", unknown).parent_path().string();
+}
+
+SdlFrontEnd::DesktopWindow* SdlFrontEnd::find(WindowId window) {
+    const auto found = windows_.find(window);
+    return found == windows_.end() ? nullptr : found->second.get();
+}
+
+WindowId SdlFrontEnd::idOf(std::uint32_t sdlWindow) const {
+    const auto found = std::find_if(windows_.begin(), windows_.end(), [&](const auto& window) {
+        return window.second->sdl() != nullptr && SDL_GetWindowID(window.second->sdl()) == sdlWindow;
+    });
+    return found == windows_.end() ? WindowId::none : found->first;
+}
+
+}  // namespace quabble

@@ -1,0 +1,42 @@
+#pragma once
+
+#include <map>
+#include <memory>
+#include <string>
+
+#include "platform/front_end.hpp"
+#include "platform/message_loop.hpp"
+
+namespace quabble {
+
+// The desktop, by way of SDL 2.
+class SdlFrontEnd final : public FrontEnd {
+ public:
+    // Nothing when there is no display to open windows on; `problem` then says why.
+    static std::unique_ptr<SdlFrontEnd> open(std::string& problem);
+    ~SdlFrontEnd() override;
+
+    // Waits for the desktop's events and passes them to the loop until the program has ended.
+    void run(MessageLoop& loop);
+
+    TimePoint now() override { return Clock::now(); }
+    void createWindow(WindowId window, const NativeWindow& traits) override;
+    void showPixels(WindowId window, const Surface& picture) override;
+    void closeWindow(WindowId window) override;
+    void minimiseWindow(WindowId window) override;
+    Size screenSize() override;
+    std::string executableFolder() override;
+
+ private:
+    class DesktopWindow;
+
+    SdlFrontEnd() = default;
+    DesktopWindow* find(WindowId window);
+    WindowId idOf(std::uint32_t sdlWindow) const;
+    Point placeOf(const NativeWindow& traits);
+    void waitForEvents(MessageLoop& loop);
+
+    std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
+};
+
+}  // namespace quabble

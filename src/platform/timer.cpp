@@ -1,0 +1,37 @@
+#include "platform/timer.hpp"
+
+#include <utility>
+
+namespace quabble {
+
+Timer::Timer(MessageLoop& loop, std::function<Task<>()> tick) : loop_(loop), tick_(std::move(tick)) {
+    loop_.timers_.push_back(this);
+}
+
+Timer::~Timer() { std::erase(loop_.timers_, this); }
+
+void Timer::setEnabled(bool enabled) {
+    if (enabled == enabled_)
+        return;
+    enabled_ = enabled;
+    startPeriod();
+}
+
+void Timer::setInterval(milliseconds interval) {
+    interval_ = interval;
+    startPeriod();
+}
+
+void Timer::startPeriod() {
+    due_.reset();
+    if (enabled_ && interval_ > milliseconds::zero())
+        due_ = loop_.frontEnd().now() + interval_;
+}
+
+Task<> Timer::tick() {
+    const auto late = loop_.frontEnd().now() - *due_;
+    *due_ += interval_ * (late / interval_ + 1);
+    return tick_();
+}
+
+}  // namespace quabble

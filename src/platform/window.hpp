@@ -1,0 +1,85 @@
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "base/task.hpp"
+#include "platform/canvas.hpp"
+#include "platform/control.hpp"
+#include "platform/input_event.hpp"
+#include "platform/message_loop.hpp"
+
+namespace quabble {
+
+// A window of the program: a fixed size, a picture of its own that is seen as it was presented last, and the
+// handlers of what happens to it. Measures in pixels are of its client area.
+class Window {
+ public:
+    enum class State { Normal, Minimised };
+
+    // What a fixed frame adds to a client area, nominally and on every machine alike. Layouts that start from a
+    // window's outer size count with it.
+    static constexpr Size nominalFrame{6, 29};
+
+    // A window with an owner is a dialog. The loop and the owner must outlive it.
+    explicit Window(MessageLoop& loop, Window* owner = nullptr);
+    virtual ~Window();
+    Window(const Window&) = delete;
+    Window& operator=(const Window&) = delete;
+
+    // A new one at every showing: what was meant for an earlier one reaches nobody.
+    WindowId id() const { return id_; }
+    bool isDialog() const { return owner_ != nullptr; }
+    bool isShown() const { return shown_; }
+    State state() const { return state_; }
+
+    Canvas& canvas() { return canvas_; }
+    Size clientSize() const { return traits_.clientSize; }
+    Size outerSize() const;
+
+    // Loads the window (Form_Load), which sets its size, caption and picture, and puts it on the screen.
+    void show();
+    // Closes the window (Form_Unload). It can be shown again.
+    void unload();
+
+    // Makes the picture, with the visible controls above it, what is seen of the window.
+    void refresh();
+
+    void minimise();
+
+ protected:
+    MessageLoop& loop() { return loop_; }
+    void setCaption(std::string caption) { traits_.caption = std::move(caption); }  // UTF-8
+    void setClientSize(Size size);
+    void setPosition(Point position) { traits_.position = position; }
+    void addControl(Control& control) { controls_.push_back(&control); }
+
+    virtual void Form_Load() {}
+    virtual void Form_Unload() {}
+    // The window was minimised or restored.
+    virtual void Form_Resize() {}
+    virtual Task<> Form_MouseDown(float x, float y);
+    virtual Task<> Form_MouseMove(float x, float y);
+    virtual Task<> Form_KeyPress(std::int16_t key);
+
+ private:
+    friend class MessageLoop;
+    Task<> handle(InputEvent event);
+    void changeState(State state);
+    Control* controlAt(float x, float y) const;
+
+    MessageLoop& loop_;
+    Window* owner_;
+    WindowId id_ = WindowId::none;
+    NativeWindow traits_;
+    Canvas canvas_;
+    Surface composed_;
+    std::vector<Control*> controls_;
+    bool shown_ = false;
+    State state_ = State::Normal;
+};
+
+}  // namespace quabble

@@ -1,0 +1,23 @@
+#include "platform/windows_1252.hpp"
+
+#include <array>
+
+namespace quabble {
+namespace {
+
+// 0x80 to 0x9F, where the code page differs from Latin-1.
+constexpr std::array<char32_t, 32> upperControls{
+    0x20AC, 0xFFFD, 0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021, 0x02C6, 0x2030, 0x0160,
+    0x2039, 0x0152, 0xFFFD, 0x017D, 0xFFFD, 0xFFFD, 0x2018, 0x2019, 0x201C, 0x201D, 0x2022,
+    0x2013, 0x2014, 0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0xFFFD, 0x017E, 0x0178};
+
+}  // namespace
+
+char32_t codePointOf(char character) {
+    const auto value = static_cast<unsigned char>(character);
+    if (value >= 0x80 && value < 0xA0)
+        return upperControls[value - 0x80U];
+    return value;
+}
+
+}  // namespace quabble
