@@ -15,7 +15,9 @@ constexpr double captionPoints = 14;
 
 }  // namespace
 
-BoardArea MainWindow::layOutClassic() { return layOutBoardAt(playPanelBox_.top); }
+BoardArea MainWindow::layOutClassic() {
+    return layOutBoardAt(playPanelBox_.top);
+}
 
 BoardArea MainWindow::layOutArcade() {
     const BoardArea area = layOutBoardAt(arcadePanelTop);
@@ -31,18 +33,26 @@ BoardArea MainWindow::layOutBoardAt(std::int32_t panelTop) {
     return {boardBox_.left, boardBox_.top, boardBox_.cellSize};
 }
 
-void MainWindow::clearWindow() { fillBox(backgroundBox_); }
+void MainWindow::clearWindow() {
+    fillBox(backgroundBox_);
+}
 
-void MainWindow::drawClassicPanel() { drawPanel(standardBtns_, string_ids::classicPanelBase); }
+void MainWindow::drawClassicPanel() {
+    drawPanel(standardBtns_, string_ids::classicPanelBase);
+}
 
 void MainWindow::drawArcadePanel() {
     drawPanel(arcadeBtns_, string_ids::arcadePanelBase);
     drawValue(arcadeBtns_[panel_boxes::level], app_.game.stats.level, false);
 }
 
-void MainWindow::drawPlayPanel() { quabble::drawPlayPanel(playPanelBox_, app_.pictures.spriteSheet); }
+void MainWindow::drawPlayPanel() {
+    quabble::drawPlayPanel(playPanelBox_, app_.pictures.spriteSheet);
+}
 
-void MainWindow::drawBoard() { quabble::drawBoard(boardBox_, app_.pictures.spriteSheet, app_.game.grid); }
+void MainWindow::drawBoard() {
+    quabble::drawBoard(boardBox_, app_.pictures.spriteSheet, app_.game.grid);
+}
 
 void MainWindow::drawCell(CellPosition place, std::int16_t tile) {
     quabble::drawCell(boardBox_, app_.pictures.spriteSheet, static_cast<std::int16_t>(place.column - 1),
@@ -67,7 +77,9 @@ void MainWindow::updateScore() {
         drawValue(standardBtns_[panel_boxes::score], app_.game.stats.score, false);
 }
 
-void MainWindow::displayLevel() { drawValue(arcadeBtns_[panel_boxes::level], app_.game.stats.level, true); }
+void MainWindow::displayLevel() {
+    drawValue(arcadeBtns_[panel_boxes::level], app_.game.stats.level, true);
+}
 
 void MainWindow::drawPreviewRow(std::int16_t revealed) {
     quabble::drawPreviewRow(previewBox_, app_.pictures.spriteSheet, app_.game.nextRow, revealed);
@@ -77,16 +89,26 @@ void MainWindow::drawGauge(double percentage) {
     quabble::drawGauge(gaugeBox_, app_.pictures.spriteSheet, percentage);
 }
 
-void MainWindow::present() { refresh(); }
+void MainWindow::present() {
+    refresh();
+}
 
-Task<> MainWindow::pause(std::chrono::milliseconds duration) { co_await loop().pause(duration); }
+Task<> MainWindow::pause(std::chrono::milliseconds duration) {
+    co_await loop().pause(duration);
+}
 
-Task<> MainWindow::runPendingMessages() { return loop().runPendingMessages(); }
+Task<> MainWindow::runPendingMessages() {
+    return loop().runPendingMessages();
+}
 
 // While the game is paused the timer stays off, whatever goes on beneath the notice.
-void MainWindow::switchBlockTimer(bool on) { timerBlocks_.setEnabled(on && !gamePaused_); }
+void MainWindow::switchBlockTimer(bool on) {
+    timerBlocks_.setEnabled(on && !gamePaused_);
+}
 
-void MainWindow::setBlockTimerInterval(std::chrono::milliseconds interval) { timerBlocks_.setInterval(interval); }
+void MainWindow::setBlockTimerInterval(std::chrono::milliseconds interval) {
+    timerBlocks_.setInterval(interval);
+}
 
 Task<> MainWindow::showResult(bool goNextLevel) {
     ResultDialog& diagWow = app_.diagWow();

@@ -62,9 +62,13 @@ ButtonSet initMMBtns(Canvas& canvas, const ScreenButton& background) {
     return buttons;
 }
 
-ButtonSet initStandardBtns(Canvas& canvas) { return layOutPanel(canvas, 8, 2); }
+ButtonSet initStandardBtns(Canvas& canvas) {
+    return layOutPanel(canvas, 8, 2);
+}
 
-ButtonSet initArcadeBtns(Canvas& canvas) { return layOutPanel(canvas, 10, 3); }
+ButtonSet initArcadeBtns(Canvas& canvas) {
+    return layOutPanel(canvas, 10, 3);
+}
 
 ScreenButton layOutPlayPanel(Canvas& canvas, const ScreenButton& background) {
     return {.surface = &canvas,

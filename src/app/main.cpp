@@ -10,7 +10,8 @@ int main() {
     std::string problem;
     const auto frontEnd = quabble::SdlFrontEnd::open(problem);
     if (!frontEnd) {
-        std::fprintf(stderr, "Quabble needs a graphical display to open its window on (%s).\n", problem.c_str());
+        std::fprintf(stderr, "Quabble needs a graphical display to open its window on (%s).\n",
+                     problem.c_str());
         return EXIT_FAILURE;
     }
     const auto clock = std::chrono::system_clock::now().time_since_epoch().count();

@@ -57,7 +57,9 @@ void MainWindow::Form_Load() {
     app_.game.grid.recreate(12, 15);
 }
 
-void MainWindow::Form_Unload() { app_.loop.end(); }
+void MainWindow::Form_Unload() {
+    app_.loop.end();
+}
 
 // The window's size is fixed. Minimising it by its frame hides a running game as a key does.
 void MainWindow::Form_Resize() {
@@ -119,7 +121,9 @@ Task<> MainWindow::lblPause_Click() {
     co_return;
 }
 
-Task<> MainWindow::timerBlocks_Timer() { return game_.blockTimerTick(); }
+Task<> MainWindow::timerBlocks_Timer() {
+    return game_.blockTimerTick();
+}
 
 void MainWindow::enablePause(bool enab) {
     gamePaused_ = enab;

@@ -84,8 +84,8 @@ class Game::Round {
     std::uint64_t number_;
 };
 
-// A move being carried out: board clicks and timer ticks do nothing while it lives. A move whose round is over
-// leaves the flag to the round that came after it.
+// A move being carried out: board clicks and timer ticks do nothing while it lives. A move whose round is
+// over leaves the flag to the round that came after it.
 class Game::Move {
  public:
     explicit Move(Game& game) : game_(game), round_(game) { game_.state_.boolProcessing = true; }

@@ -4,7 +4,9 @@
 
 namespace quabble {
 
-std::int32_t pointsFor(std::int32_t clusterSize) { return clusterSize * (clusterSize + 1) / 2; }
+std::int32_t pointsFor(std::int32_t clusterSize) {
+    return clusterSize * (clusterSize + 1) / 2;
+}
 
 void accountMove(GameStats& stats, std::int32_t clusterSize) {
     stats.score += pointsFor(clusterSize);

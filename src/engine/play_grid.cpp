@@ -118,7 +118,9 @@ bool PlayGrid::shiftIfBesideGap(std::int16_t column, std::int16_t delta) {
 }
 
 // The blocks have fallen: a column is empty exactly when its bottom cell is.
-bool PlayGrid::isColumnEmpty(std::int16_t column) const { return at({column, gridRows_}).isEmpty(); }
+bool PlayGrid::isColumnEmpty(std::int16_t column) const {
+    return at({column, gridRows_}).isEmpty();
+}
 
 void PlayGrid::shiftColumn(std::int16_t column, std::int16_t delta) {
     for (std::int16_t row = 1; row <= gridRows_; ++row) {

@@ -15,7 +15,9 @@ std::int32_t stoneLimit(std::int16_t level) {
     return level == 7 ? 10 : 8;
 }
 
-std::int32_t drawRange(std::int16_t level) { return level <= 3 ? level * 10 + 608 : level * 30; }
+std::int32_t drawRange(std::int16_t level) {
+    return level <= 3 ? level * 10 + 608 : level * 30;
+}
 
 GridCell randomBlock(std::int16_t colourCount, RandomSource& random) {
     const std::int32_t drawn = roundHalfEven(random.next() * (colourCount * 10 - 10));

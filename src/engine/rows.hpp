@@ -16,9 +16,9 @@ struct RowRecipe {
     std::int16_t colourCount = 0;        // 3 or 4
 };
 
-// A random row of the given width. A bomb has the chance 2.5 / N per cell, with N = 10 level + 608 up to level
-// 3 and 30 level from there; a stone has (stone limit) / N, with the limit 0 up to level 4, 6 up to 6, 10 at 7
-// and 8 from 8 on. The first and the last colour are a little rarer than the others.
+// A random row of the given width. A bomb has the chance 2.5 / N per cell, with N = 10 level + 608 up to
+// level 3 and 30 level from there; a stone has (stone limit) / N, with the limit 0 up to level 4, 6 up to 6,
+// 10 at 7 and 8 from 8 on. The first and the last colour are a little rarer than the others.
 GridRow makeNextRow(std::int16_t gridCols, const RowRecipe& recipe, RandomSource& random);
 
 // Empties the board, then fills its rows from `firstRow` down with random ones. Returns the last row made,

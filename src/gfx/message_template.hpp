@@ -19,9 +19,9 @@ class TemplateArgument {
     std::string text_;
 };
 
-// Replaces every occurrence of each key by its value, pair by pair in the order given: key, value, key, value.
-// A last key without a value gets the value of the pair before it (the first one the empty text). A value must
-// not contain its own key.
+// Replaces every occurrence of each key by its value, pair by pair in the order given: key, value, key,
+// value. A last key without a value gets the value of the pair before it (the first one the empty text). A
+// value must not contain its own key.
 std::string fillText(std::string_view text, std::initializer_list<TemplateArgument> keysAndValues);
 
 // The same for the text of an id of the string table.

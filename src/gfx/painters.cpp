@@ -11,7 +11,8 @@ namespace quabble {
 namespace {
 
 Rect cellRect(const ScreenButton& box, std::int32_t column, std::int32_t row) {
-    return Rect::ofSize(box.left + column * box.cellSize, box.top + row * box.cellSize, box.cellSize, box.cellSize);
+    return Rect::ofSize(box.left + column * box.cellSize, box.top + row * box.cellSize, box.cellSize,
+                        box.cellSize);
 }
 
 void copyTile(const ScreenButton& box, const Surface& spriteSheet, const Rect& square, std::int16_t tile) {
@@ -42,7 +43,8 @@ void drawLabelledBox(const ScreenButton& box, BoxStyle style, bool highlighted, 
     if (style == BoxStyle::DoubleFramed)
         picture.outline(box.rect().shrunkBy(1), palette::lightPen.colour);
 
-    constexpr std::int32_t format = text_format::centre + text_format::verticalCentre + text_format::singleLine;
+    constexpr std::int32_t format =
+        text_format::centre + text_format::verticalCentre + text_format::singleLine;
     Rect area = box.rect();
     drawText(picture, area, caption, format, palette::black, box.surface->font);
     area.right += shadowOffset;
@@ -51,7 +53,8 @@ void drawLabelledBox(const ScreenButton& box, BoxStyle style, bool highlighted, 
              box.surface->font);
 }
 
-void drawShadowText(const ScreenButton& box, std::int32_t offset, std::string_view text, std::int32_t format) {
+void drawShadowText(const ScreenButton& box, std::int32_t offset, std::string_view text,
+                    std::int32_t format) {
     const std::int32_t flags = format == defaultTextFormat ? text_format::verticalCentre : format;
     Rect area = box.rect();
     drawText(box.surface->picture, area, text, flags, palette::black, box.surface->font);

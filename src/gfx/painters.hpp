@@ -18,16 +18,16 @@ enum class BoxStyle { Plain, Framed, DoubleFramed };
 // Fills the box; one without a brush is left as it is.
 void fillBox(const ScreenButton& box);
 
-// Draws the box with its caption in the middle. The front copy is written in the rectangle whose right edge is
-// moved right and whose bottom edge is moved up by `shadowOffset` pixels, so it lies half as far from the black
-// one. Each copy is clipped to its own rectangle.
+// Draws the box with its caption in the middle. The front copy is written in the rectangle whose right edge
+// is moved right and whose bottom edge is moved up by `shadowOffset` pixels, so it lies half as far from the
+// black one. Each copy is clipped to its own rectangle.
 void drawLabelledBox(const ScreenButton& box, BoxStyle style, bool highlighted, std::int32_t shadowOffset,
                      std::string_view caption);
 
 constexpr std::int32_t defaultTextFormat = -1;  // at the top left
 
-// Writes a text of one or more lines. The front copy is written in the rectangle whose left edge is moved right
-// and whose top edge is moved up by `offset` pixels. The format is drawText's, or the default.
+// Writes a text of one or more lines. The front copy is written in the rectangle whose left edge is moved
+// right and whose top edge is moved up by `offset` pixels. The format is drawText's, or the default.
 void drawShadowText(const ScreenButton& box, std::int32_t offset, std::string_view text, std::int32_t format);
 
 // The painters below copy from the sprite sheet.

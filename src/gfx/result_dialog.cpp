@@ -14,8 +14,8 @@ constexpr Font textFont{Typeface::Sans, 12};
 constexpr Font buttonFont{Typeface::Sans, 14};
 
 std::string figures(std::uint16_t templateId, const GameStats& stats, std::int32_t level) {
-    return fillTemplate(templateId, {"|1", stats.score, "|2", level, "|3", stats.blocksCleared, "|4",
-                                     stats.largestCluster});
+    return fillTemplate(
+        templateId, {"|1", stats.score, "|2", level, "|3", stats.blocksCleared, "|4", stats.largestCluster});
 }
 
 std::string titled(std::uint16_t titleId, const std::string& body) {

@@ -9,8 +9,8 @@
 
 namespace quabble {
 
-// What the result dialog says about a game that ended or, with `goNextLevel`, about a level that was completed:
-// a title, then the figures on lines of their own.
+// What the result dialog says about a game that ended or, with `goNextLevel`, about a level that was
+// completed: a title, then the figures on lines of their own.
 std::string resultText(const GameState& game, bool goNextLevel);
 
 // The dialog that reports the outcome of a game or of an arcade level. Closing it is its only result.

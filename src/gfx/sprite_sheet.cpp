@@ -46,7 +46,9 @@ Surface standInSheet() {
         drawStandInTile(sheet, tile);
     const Point mask = sprites::maskAt(sprites::tileSize);
     sheet.fill(Rect::ofSize(mask.x, mask.y, sprites::tileSize, sprites::tileSize), standInMask);
-    const auto gauge = [](Point at) { return Rect::ofSize(at.x, at.y, sprites::gaugeWidth, sprites::gaugeRows); };
+    const auto gauge = [](Point at) {
+        return Rect::ofSize(at.x, at.y, sprites::gaugeWidth, sprites::gaugeRows);
+    };
     sheet.fill(gauge(sprites::emptyGauge), standInPanel);
     sheet.fill(gauge(sprites::fullGauge), palette::highlightColour);
     const Rect panel = Rect::ofSize(sprites::playPanel.x, sprites::playPanel.y, sprites::playPanelSize.width,

@@ -12,8 +12,12 @@ namespace quabble {
 namespace sprites {
 constexpr Size sheetSize{400, 838};  // at least
 constexpr std::int32_t tileSize = 28;
-constexpr Point tileAt(std::int16_t tile, std::int32_t cellSize) { return {tile * cellSize, 0}; }
-constexpr Point maskAt(std::int32_t cellSize) { return {0, cellSize}; }
+constexpr Point tileAt(std::int16_t tile, std::int32_t cellSize) {
+    return {tile * cellSize, 0};
+}
+constexpr Point maskAt(std::int32_t cellSize) {
+    return {0, cellSize};
+}
 constexpr std::int32_t gaugeRows = 241;
 constexpr std::int32_t gaugeWidth = 30;
 constexpr Point fullGauge{274, 29};

@@ -34,7 +34,8 @@ struct BitmapLayout {
 };
 
 std::optional<BitmapLayout> readLayout(std::span<const std::byte> file) {
-    if (file.size() < fileHeaderSize + smallestInfoHeader || file[0] != std::byte{'B'} || file[1] != std::byte{'M'})
+    if (file.size() < fileHeaderSize + smallestInfoHeader || file[0] != std::byte{'B'} ||
+        file[1] != std::byte{'M'})
         return std::nullopt;
     const auto width = static_cast<std::int32_t>(read32(file, 18));
     const auto height = static_cast<std::int32_t>(read32(file, 22));

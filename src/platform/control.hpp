@@ -34,7 +34,8 @@ class Label final : public Control {
     void paint(Surface& surface) const override {
         surface.fill(area, background);
         drawText(surface, area, caption,
-                 text_format::centre + text_format::verticalCentre + text_format::singleLine, textColour, font);
+                 text_format::centre + text_format::verticalCentre + text_format::singleLine, textColour,
+                 font);
     }
     Task<> mouseDown() override { return onClick(); }
 };

@@ -18,9 +18,9 @@ enum class WindowId : std::uint32_t { none = 0 };
 
 // What a native window is made from. It never changes its size.
 struct NativeWindow {
-    std::string caption;            // UTF-8
-    Size clientSize;                // what the program paints
-    std::optional<Point> position;  // of its outer frame; without one, centred on its owner or the screen
+    std::string caption;              // UTF-8
+    Size clientSize;                  // what the program paints
+    std::optional<Point> position;    // of its outer frame; without one, centred on its owner or the screen
     WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner and centres on it
 };
 
@@ -34,8 +34,8 @@ class FrontEnd {
 
     // Makes a window and shows it; it is black until its first pixels come.
     virtual void createWindow(WindowId window, const NativeWindow& traits) = 0;
-    // Shows the picture, of the window's client size, and keeps it: when the window is uncovered or restored the
-    // front end shows it again by itself.
+    // Shows the picture, of the window's client size, and keeps it: when the window is uncovered or restored
+    // the front end shows it again by itself.
     virtual void showPixels(WindowId window, const Surface& picture) = 0;
     virtual void closeWindow(WindowId window) = 0;
     // Asks for the window to be minimised; an event reports when it is.

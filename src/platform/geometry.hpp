@@ -25,7 +25,8 @@ struct Rect {
     std::int32_t right = 0;
     std::int32_t bottom = 0;
 
-    static constexpr Rect ofSize(std::int32_t left, std::int32_t top, std::int32_t width, std::int32_t height) {
+    static constexpr Rect ofSize(std::int32_t left, std::int32_t top, std::int32_t width,
+                                 std::int32_t height) {
         return {left, top, left + width, top + height};
     }
 

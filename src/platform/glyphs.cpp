@@ -63,7 +63,9 @@ ScaledFont::ScaledFont(Typeface face, double points) : outlines_(std::make_uniqu
 
 ScaledFont::~ScaledFont() = default;
 
-std::int32_t ScaledFont::wholePixel(double pen) { return static_cast<std::int32_t>(std::floor(pen)); }
+std::int32_t ScaledFont::wholePixel(double pen) {
+    return static_cast<std::int32_t>(std::floor(pen));
+}
 
 const Glyph& ScaledFont::glyph(char character, double pen) {
     const double fraction = pen - std::floor(pen);
@@ -81,8 +83,8 @@ Glyph ScaledFont::render(char character, double shift) const {
     int top = 0;
     int right = 0;
     int bottom = 0;
-    stbtt_GetCodepointBitmapBoxSubpixel(&outlines_->info, codePoint, scale_, scale_, shiftX, 0, &left, &top, &right,
-                                        &bottom);
+    stbtt_GetCodepointBitmapBoxSubpixel(&outlines_->info, codePoint, scale_, scale_, shiftX, 0, &left, &top,
+                                        &right, &bottom);
     Glyph glyph{left, top, right - left, bottom - top, {}};
     glyph.coverage.resize(static_cast<std::size_t>(glyph.width) * static_cast<std::size_t>(glyph.height));
     if (!glyph.coverage.empty()) {

@@ -35,7 +35,8 @@ Task<> MessageLoop::run() {
 
 void MessageLoop::post(const InputEvent& event) {
     const bool supersedes = event.kind == EventKind::MouseMove && !events_.empty() &&
-                            events_.back().kind == EventKind::MouseMove && events_.back().window == event.window;
+                            events_.back().kind == EventKind::MouseMove &&
+                            events_.back().window == event.window;
     if (supersedes)
         events_.back() = event;
     else
@@ -78,7 +79,9 @@ bool MessageLoop::isOver(std::optional<TimePoint> wait) const {
     return wait ? frontEnd_.now() >= *wait : hasMessage();
 }
 
-bool MessageLoop::hasMessage() const { return !ended_ && (!events_.empty() || firstDueTimer() != nullptr); }
+bool MessageLoop::hasMessage() const {
+    return !ended_ && (!events_.empty() || firstDueTimer() != nullptr);
+}
 
 Timer* MessageLoop::firstDueTimer() const {
     Timer* first = nullptr;

@@ -6,7 +6,9 @@
 namespace quabble {
 
 Surface::Surface(std::int32_t width, std::int32_t height)
-    : width_(width), height_(height), pixels_(static_cast<std::size_t>(width) * static_cast<std::size_t>(height)) {}
+    : width_(width),
+      height_(height),
+      pixels_(static_cast<std::size_t>(width) * static_cast<std::size_t>(height)) {}
 
 Colour Surface::at(std::int32_t x, std::int32_t y) const {
     assert(bounds().contains(x, y));
@@ -62,8 +64,8 @@ void Surface::combine(const Rect& area, const Surface& source, Point from, Combi
     if (clipped.isEmpty())
         return;
     for (std::int32_t y = clipped.top; y < clipped.bottom; ++y) {
-        const auto to = row(y).subspan(static_cast<std::size_t>(clipped.left),
-                                       static_cast<std::size_t>(clipped.width()));
+        const auto to =
+            row(y).subspan(static_cast<std::size_t>(clipped.left), static_cast<std::size_t>(clipped.width()));
         const auto line = source.row(y - dy).subspan(static_cast<std::size_t>(clipped.left - dx), to.size());
         std::transform(to.begin(), to.end(), line.begin(), to.begin(), combine);
     }

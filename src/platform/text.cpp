@@ -34,7 +34,8 @@ void paintLine(Surface& surface, const Rect& clip, std::string_view text, Point 
     const std::int32_t baseline = topLeft.y + scaled.ascent();
     double pen = topLeft.x;
     for (const char character : text) {
-        paintGlyph(surface, clip, scaled.glyph(character, pen), {ScaledFont::wholePixel(pen), baseline}, colour);
+        paintGlyph(surface, clip, scaled.glyph(character, pen), {ScaledFont::wholePixel(pen), baseline},
+                   colour);
         pen += scaled.advance(character);
     }
     if (font.underlined) {

@@ -8,7 +8,9 @@ Timer::Timer(MessageLoop& loop, std::function<Task<>()> tick) : loop_(loop), tic
     loop_.timers_.push_back(this);
 }
 
-Timer::~Timer() { std::erase(loop_.timers_, this); }
+Timer::~Timer() {
+    std::erase(loop_.timers_, this);
+}
 
 void Timer::setEnabled(bool enabled) {
     if (enabled == enabled_)

@@ -8,8 +8,8 @@
 
 namespace quabble {
 
-// A periodic timer. Its ticks come as messages; of several that fall due while none is delivered, one comes, and
-// the next one is due at the following whole period. It starts switched off, with no interval.
+// A periodic timer. Its ticks come as messages; of several that fall due while none is delivered, one comes,
+// and the next one is due at the following whole period. It starts switched off, with no interval.
 class Timer {
  public:
     // `tick` makes the handler's task.

@@ -5,8 +5,7 @@
 
 namespace quabble {
 
-Window::Window(MessageLoop& loop, Window* owner)
-    : loop_(loop), owner_(owner) {
+Window::Window(MessageLoop& loop, Window* owner) : loop_(loop), owner_(owner) {
     loop_.windows_.push_back(this);
 }
 
@@ -44,8 +43,8 @@ void Window::unload() {
 }
 
 void Window::refresh() {
-    const bool covered =
-        std::any_of(controls_.begin(), controls_.end(), [](const Control* control) { return control->visible; });
+    const bool covered = std::any_of(controls_.begin(), controls_.end(),
+                                     [](const Control* control) { return control->visible; });
     if (!covered) {
         loop_.frontEnd().showPixels(id_, canvas_.picture);
         return;
@@ -58,11 +57,19 @@ void Window::refresh() {
     loop_.frontEnd().showPixels(id_, composed_);
 }
 
-void Window::minimise() { loop_.frontEnd().minimiseWindow(id_); }
+void Window::minimise() {
+    loop_.frontEnd().minimiseWindow(id_);
+}
 
-Task<> Window::Form_MouseDown(float, float) { co_return; }
-Task<> Window::Form_MouseMove(float, float) { co_return; }
-Task<> Window::Form_KeyPress(std::int16_t) { co_return; }
+Task<> Window::Form_MouseDown(float, float) {
+    co_return;
+}
+Task<> Window::Form_MouseMove(float, float) {
+    co_return;
+}
+Task<> Window::Form_KeyPress(std::int16_t) {
+    co_return;
+}
 
 Task<> Window::handle(InputEvent event) {
     switch (event.kind) {

@@ -20,8 +20,8 @@ class Window {
  public:
     enum class State { Normal, Minimised };
 
-    // What a fixed frame adds to a client area, nominally and on every machine alike. Layouts that start from a
-    // window's outer size count with it.
+    // What a fixed frame adds to a client area, nominally and on every machine alike. Layouts that start from
+    // a window's outer size count with it.
     static constexpr Size nominalFrame{6, 29};
 
     // A window with an owner is a dialog. The loop and the owner must outlive it.

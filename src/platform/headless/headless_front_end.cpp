@@ -14,7 +14,9 @@ void HeadlessFrontEnd::showPixels(WindowId window, const Surface& picture) {
     ++shown->second.timesShown;
 }
 
-void HeadlessFrontEnd::closeWindow(WindowId window) { windows_.erase(window); }
+void HeadlessFrontEnd::closeWindow(WindowId window) {
+    windows_.erase(window);
+}
 
 void HeadlessFrontEnd::minimiseWindow(WindowId window) {
     windows_.at(window).minimised = true;

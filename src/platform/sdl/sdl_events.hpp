@@ -8,8 +8,8 @@
 
 namespace quabble {
 
-// What an SDL event means to the window it happened to; nothing for those that mean nothing here. The window's
-// id is left to the caller.
+// What an SDL event means to the window it happened to; nothing for those that mean nothing here. The
+// window's id is left to the caller.
 std::optional<InputEvent> translate(const SDL_Event& event);
 
 // SDL's number of the window that the event happened to, 0 for none.

@@ -13,7 +13,9 @@ namespace quabble {
 namespace {
 
 // The terminal's end asks the process to end like any other request; SDL turns SIGTERM into an event.
-extern "C" void passOnHangUp(int) { std::raise(SIGTERM); }
+extern "C" void passOnHangUp(int) {
+    std::raise(SIGTERM);
+}
 
 }  // namespace
 
@@ -22,7 +24,8 @@ class SdlFrontEnd::DesktopWindow {
  public:
     DesktopWindow(const NativeWindow& traits, Point position, SDL_Window* owner)
         : window_(SDL_CreateWindow(traits.caption.c_str(), position.x, position.y, traits.clientSize.width,
-                                   traits.clientSize.height, owner == nullptr ? 0U : Uint32{SDL_WINDOW_SKIP_TASKBAR})) {
+                                   traits.clientSize.height,
+                                   owner == nullptr ? 0U : Uint32{SDL_WINDOW_SKIP_TASKBAR})) {
         if (owner != nullptr && window_ != nullptr)
             SDL_SetWindowModalFor(window_, owner);
     }
@@ -126,8 +129,8 @@ void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
             return;
         }
         const WindowId window = idOf(windowOf(event));
-        if (event.type == SDL_WINDOWEVENT &&
-            (event.window.event == SDL_WINDOWEVENT_EXPOSED || event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED)) {
+        if (event.type == SDL_WINDOWEVENT && (event.window.event == SDL_WINDOWEVENT_EXPOSED ||
+                                              event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED)) {
             if (DesktopWindow* shown = find(window))
                 shown->showAgain();
         }
@@ -149,7 +152,8 @@ Point SdlFrontEnd::placeOf(const NativeWindow& traits) {
         return *traits.position;
     const DesktopWindow* owner = find(traits.owner);
     if (owner == nullptr)
-        return {static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED), static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED)};
+        return {static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED),
+                static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED)};
     Rect area;
     SDL_GetWindowPosition(owner->sdl(), &area.left, &area.top);
     SDL_GetWindowSize(owner->sdl(), &area.right, &area.bottom);
@@ -162,7 +166,9 @@ void SdlFrontEnd::showPixels(WindowId window, const Surface& picture) {
         shown->show(picture);
 }
 
-void SdlFrontEnd::closeWindow(WindowId window) { windows_.erase(window); }
+void SdlFrontEnd::closeWindow(WindowId window) {
+    windows_.erase(window);
+}
 
 void SdlFrontEnd::minimiseWindow(WindowId window) {
     if (const DesktopWindow* shown = find(window))

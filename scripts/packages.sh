@@ -1,0 +1,64 @@
+# Installs the system packages that are missing; to be sourced. Say which group is needed:
+#   need_packages play     to build and start the game
+#   need_packages check    to run every check as well
+
+say() { printf '%s: %s\n' "${0##*/}" "$*"; }
+fail() {
+    say "$*" >&2
+    exit 1
+}
+
+packages_of() {
+    local list="cmake ninja-build g++ pkg-config libsdl2-dev libstb-dev fonts-liberation librsvg2-bin"
+    # From Debian 13 and Ubuntu 24.04 on, Sans Narrow is a package of its own.
+    case "$1" in
+        debian-12) ;;
+        debian-13 | ubuntu-24.04) list+=" fonts-liberation-sans-narrow" ;;
+        *) return 1 ;;
+    esac
+    [ "$2" = play ] ||
+        list+=" libgtest-dev clang-19 clang-format-19 clang-tidy-19 xvfb openbox libxtst-dev"
+    printf '%s' "$list"
+}
+
+need_packages() {
+    local system list missing="" package
+    system=$(. /etc/os-release 2>/dev/null && printf '%s-%s' "${ID:-unknown}" "${VERSION_ID:-}")
+    if ! list=$(packages_of "$system" "$1"); then
+        fail "this system ($system) is not known; Debian 12, Debian 13 and Ubuntu 24.04 are. On Debian 12 these packages are needed: $(packages_of debian-12 "$1")"
+    fi
+    for package in $list; do
+        dpkg-query -W -f '${db:Status-Status}\n' "$package" 2>/dev/null | grep -qx installed || missing+=" $package"
+    done
+    [ -n "$missing" ] || return 0
+    local as_root=""
+    if [ "$(id -u)" -ne 0 ]; then
+        command -v sudo >/dev/null || fail "these packages are missing, and there is no sudo to install them with:$missing"
+        as_root=sudo
+    fi
+    say "installing$missing"
+    local log
+    log=$(mktemp)
+    # shellcheck disable=SC2086  # the lists are words
+    if ! { $as_root apt-get update -qq && $as_root env DEBIAN_FRONTEND=noninteractive \
+        apt-get install -y -qq --no-install-recommends $missing; } </dev/null >"$log" 2>&1; then
+        tail -n 20 "$log" >&2
+        rm -f "$log"
+        fail "could not install$missing"
+    fi
+    rm -f "$log"
+}
+
+# Configures a preset when that was not done yet (ninja sees to later changes), and builds it.
+build_preset() {
+    local log
+    log=$(mktemp)
+    if { [ -f "build/$1/build.ninja" ] || cmake --preset "$1"; } >"$log" 2>&1 &&
+        cmake --build --preset "$1" >>"$log" 2>&1; then
+        rm -f "$log"
+    else
+        tail -n 60 "$log" >&2
+        rm -f "$log"
+        fail "the $1 build failed"
+    fi
+}
