@@ -16,9 +16,8 @@ constexpr std::int32_t twipsPerPixel = 15;
 
 // The first box that the point hits, of those that are buttons.
 std::optional<std::size_t> buttonAt(const ButtonSet& boxes, float x, float y) {
-    const auto hit = std::find_if(boxes.begin(), boxes.end(), [&](const ScreenButton& box) {
-        return box.active == BoxKind::Button && hitTest(box, x, y);
-    });
+    const auto hit = std::ranges::find_if(
+        boxes, [&](const ScreenButton& box) { return box.active == BoxKind::Button && hitTest(box, x, y); });
     if (hit == boxes.end())
         return std::nullopt;
     return static_cast<std::size_t>(hit - boxes.begin()) + 1;

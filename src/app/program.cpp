@@ -2,6 +2,8 @@
 
 #include <filesystem>
 
+#include "app/icon.hpp"
+
 namespace quabble {
 namespace {
 
@@ -14,6 +16,7 @@ std::string withSeparator(std::string folder) {
 }
 
 void Main(AppState& app) {
+    app.loop.frontEnd().setIcon(applicationIcon());
     app.programFolder = withSeparator(app.loop.frontEnd().executableFolder());
     app.pictures = loadGraphics(app.programFolder);
     app.frmQuabble().show();

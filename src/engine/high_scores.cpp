@@ -17,8 +17,7 @@ HighScoreTable& HighScores::table(std::int16_t tableIndex) {
 
 std::int16_t HighScores::rankOf(std::int16_t tableIndex, std::int32_t score) const {
     const auto& scores = table(tableIndex).scores;
-    const auto place =
-        std::find_if(scores.begin(), scores.end(), [&](std::int32_t held) { return held < score; });
+    const auto place = std::ranges::find_if(scores, [&](std::int32_t held) { return held < score; });
     return static_cast<std::int16_t>(place - scores.begin() + 1);
 }
 

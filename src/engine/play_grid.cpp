@@ -20,7 +20,8 @@ bool PlayGrid::isInGrid(CellPosition place) const {
 
 std::size_t PlayGrid::index(CellPosition place) const {
     assert(isInGrid(place));
-    return static_cast<std::size_t>((place.row - 1) * maxGridCols + (place.column - 1));
+    const auto row = static_cast<std::size_t>(place.row - 1);
+    return row * maxGridCols + static_cast<std::size_t>(place.column - 1);
 }
 
 CellPosition PlayGrid::neighbour(CellPosition place, Direction direction) const {
@@ -35,8 +36,8 @@ bool PlayGrid::clusterAtLeast(CellPosition place, std::int16_t minimum) {
 }
 
 void PlayGrid::resetMarks() {
-    std::transform(cells_.begin(), cells_.end(), clusterMarks_.begin(),
-                   [](const GridCell& cell) { return static_cast<std::uint8_t>(cell.colour); });
+    std::ranges::transform(cells_, clusterMarks_.begin(),
+                           [](const GridCell& cell) { return static_cast<std::uint8_t>(cell.colour); });
 }
 
 std::int16_t PlayGrid::markCluster(CellPosition start) {
@@ -143,7 +144,7 @@ void PlayGrid::pushRowFromBottom(const GridRow& row) {
     assert(row.size() == static_cast<std::size_t>(gridCols_));
     std::copy(cells_.begin() + maxGridCols, cells_.begin() + std::ptrdiff_t{maxGridCols} * gridRows_,
               cells_.begin());
-    std::copy(row.begin(), row.end(), &at({1, gridRows_}));
+    std::ranges::copy(row, &at({1, gridRows_}));
 }
 
 bool PlayGrid::isTopRowOccupied() const {

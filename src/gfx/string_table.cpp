@@ -19,8 +19,8 @@ constexpr Entry table[] = {
 }  // namespace
 
 std::string_view loadString(std::uint16_t id) {
-    const auto* entry = std::find_if(std::begin(table), std::end(table),
-                                     [&](const Entry& candidate) { return candidate.id == id; });
+    const auto* entry =
+        std::ranges::find_if(table, [&](const Entry& candidate) { return candidate.id == id; });
     assert(entry != std::end(table));
     return entry->text;
 }

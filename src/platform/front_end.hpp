@@ -3,6 +3,7 @@
 #include <chrono>
 #include <cstdint>
 #include <optional>
+#include <span>
 #include <string>
 
 #include "platform/geometry.hpp"
@@ -24,6 +25,12 @@ struct NativeWindow {
     WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner and centres on it
 };
 
+// A small picture that stands for the program, four bytes a pixel: red, green, blue and opacity.
+struct Icon {
+    Size size;
+    std::span<const unsigned char> rgba;  // must outlive the program's windows
+};
+
 // The machine that the program runs on, seen from the program: what a port has to write. Everything is called
 // on the one thread of the program. Operations with a body here may be left out by a machine that lacks them.
 class FrontEnd {
@@ -40,6 +47,8 @@ class FrontEnd {
     virtual void closeWindow(WindowId window) = 0;
     // Asks for the window to be minimised; an event reports when it is.
     virtual void minimiseWindow(WindowId /*window*/) {}
+    // The icon of all windows that are made from now on.
+    virtual void setIcon(const Icon& /*icon*/) {}
     virtual Size screenSize() { return {1024, 768}; }
 
     // The folder of the running program, without a separator at its end.

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cassert>
+#include <ranges>
 #include <utility>
 
 #include "platform/timer.hpp"
@@ -55,17 +56,14 @@ std::optional<TimePoint> MessageLoop::nextDeadline() const {
         return programWaitsUntil_;
     if (!events_.empty())
         return frontEnd_.now();
-    std::optional<TimePoint> earliest;
-    for (const Timer* timer : timers_) {
-        const auto due = timer->nextDue();
-        if (due && (!earliest || *due < *earliest))
-            earliest = due;
-    }
-    return earliest;
+    TimePoint earliest = Timer::never;
+    for (const Timer* timer : timers_)
+        earliest = std::min(earliest, timer->nextDue());
+    return earliest == Timer::never ? std::nullopt : std::optional(earliest);
 }
 
 void MessageLoop::requestEnd() {
-    const auto main = std::find_if(windows_.rbegin(), windows_.rend(), [](const Window* window) {
+    const auto main = std::ranges::find_if(windows_ | std::views::reverse, [](const Window* window) {
         return window->isShown() && !window->isDialog();
     });
     if (main != windows_.rend())
@@ -86,8 +84,7 @@ bool MessageLoop::hasMessage() const {
 Timer* MessageLoop::firstDueTimer() const {
     Timer* first = nullptr;
     for (Timer* timer : timers_) {
-        const auto due = timer->nextDue();
-        if (due && *due <= frontEnd_.now() && (first == nullptr || *due < *first->nextDue()))
+        if (timer->nextDue() <= frontEnd_.now() && (first == nullptr || timer->nextDue() < first->nextDue()))
             first = timer;
     }
     return first;
@@ -115,8 +112,8 @@ Task<> MessageLoop::deliver(InputEvent event) {
 }
 
 Window* MessageLoop::findWindow(WindowId id) const {
-    const auto found = std::find_if(windows_.begin(), windows_.end(),
-                                    [&](const Window* window) { return window->id() == id; });
+    const auto found =
+        std::ranges::find_if(windows_, [&](const Window* window) { return window->id() == id; });
     return found == windows_.end() ? nullptr : *found;
 }
 

@@ -25,14 +25,13 @@ void Timer::setInterval(milliseconds interval) {
 }
 
 void Timer::startPeriod() {
-    due_.reset();
-    if (enabled_ && interval_ > milliseconds::zero())
-        due_ = loop_.frontEnd().now() + interval_;
+    const bool runs = enabled_ && interval_ > milliseconds::zero();
+    due_ = runs ? loop_.frontEnd().now() + interval_ : never;
 }
 
 Task<> Timer::tick() {
-    const auto late = loop_.frontEnd().now() - *due_;
-    *due_ += interval_ * (late / interval_ + 1);
+    const auto late = loop_.frontEnd().now() - due_;
+    due_ += interval_ * (late / interval_ + 1);
     return tick_();
 }
 

@@ -1,7 +1,6 @@
 #pragma once
 
 #include <functional>
-#include <optional>
 
 #include "base/task.hpp"
 #include "platform/message_loop.hpp"
@@ -24,8 +23,9 @@ class Timer {
     // Starts the period of a running timer anew. A timer with an interval of 0 never ticks.
     void setInterval(milliseconds interval);
 
-    // When the next tick falls due; nothing while no tick will come.
-    std::optional<TimePoint> nextDue() const { return due_; }
+    // When the next tick falls due.
+    TimePoint nextDue() const { return due_; }
+    static constexpr TimePoint never = TimePoint::max();
 
  private:
     friend class MessageLoop;
@@ -36,7 +36,7 @@ class Timer {
     std::function<Task<>()> tick_;
     milliseconds interval_{0};
     bool enabled_ = false;
-    std::optional<TimePoint> due_;
+    TimePoint due_ = never;
 };
 
 }  // namespace quabble

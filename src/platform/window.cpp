@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <ranges>
 
 namespace quabble {
 
@@ -43,8 +44,8 @@ void Window::unload() {
 }
 
 void Window::refresh() {
-    const bool covered = std::any_of(controls_.begin(), controls_.end(),
-                                     [](const Control* control) { return control->visible; });
+    const bool covered =
+        std::ranges::any_of(controls_, [](const Control* control) { return control->visible; });
     if (!covered) {
         loop_.frontEnd().showPixels(id_, canvas_.picture);
         return;
@@ -108,7 +109,7 @@ void Window::changeState(State state) {
 Control* Window::controlAt(float x, float y) const {
     const auto column = static_cast<std::int32_t>(std::floor(x));
     const auto row = static_cast<std::int32_t>(std::floor(y));
-    const auto found = std::find_if(controls_.rbegin(), controls_.rend(), [&](const Control* control) {
+    const auto found = std::ranges::find_if(controls_ | std::views::reverse, [&](const Control* control) {
         return control->visible && control->area.contains(column, row);
     });
     return found == controls_.rend() ? nullptr : *found;

@@ -22,30 +22,29 @@ extern "C" void passOnHangUp(int) {
 // A window of the desktop and the picture it shows.
 class SdlFrontEnd::DesktopWindow {
  public:
-    DesktopWindow(const NativeWindow& traits, Point position, SDL_Window* owner)
-        : window_(SDL_CreateWindow(traits.caption.c_str(), position.x, position.y, traits.clientSize.width,
-                                   traits.clientSize.height,
-                                   owner == nullptr ? 0U : Uint32{SDL_WINDOW_SKIP_TASKBAR})) {
-        if (owner != nullptr && window_ != nullptr)
-            SDL_SetWindowModalFor(window_, owner);
+    DesktopWindow(const NativeWindow& traits, Point position, const DesktopWindow* owner) {
+        const bool isDialog = owner != nullptr;
+        SDL_SetHint(SDL_HINT_X11_WINDOW_TYPE, isDialog ? "_NET_WM_WINDOW_TYPE_DIALOG" : "");
+        const Uint32 flags = SDL_WINDOW_HIDDEN | (isDialog ? Uint32{SDL_WINDOW_SKIP_TASKBAR} : 0U);
+        window_.reset(SDL_CreateWindow(traits.caption.c_str(), position.x, position.y,
+                                       traits.clientSize.width, traits.clientSize.height, flags));
+        if (isDialog && window_)
+            SDL_SetWindowModalFor(sdl(), owner->sdl());
     }
-    ~DesktopWindow() {
-        if (window_ != nullptr)
-            SDL_DestroyWindow(window_);
-    }
-    DesktopWindow(const DesktopWindow&) = delete;
-    DesktopWindow& operator=(const DesktopWindow&) = delete;
 
-    SDL_Window* sdl() const { return window_; }
+    SDL_Window* sdl() const { return window_.get(); }
 
+    // The first picture brings the window onto the screen.
     void show(const Surface& picture) {
         picture_ = picture;
+        if (window_ && (SDL_GetWindowFlags(sdl()) & SDL_WINDOW_HIDDEN) != 0)
+            SDL_ShowWindow(sdl());
         showAgain();
     }
 
     // A window that was uncovered, restored or resized gets its picture again.
     void showAgain() {
-        SDL_Surface* screen = window_ == nullptr ? nullptr : SDL_GetWindowSurface(window_);
+        SDL_Surface* screen = window_ ? SDL_GetWindowSurface(sdl()) : nullptr;
         if (screen == nullptr)
             return;
         const bool direct = screen->format->BytesPerPixel == 4 && screen->format->Rmask == 0xFF0000 &&
@@ -54,7 +53,7 @@ class SdlFrontEnd::DesktopWindow {
             copyTo(*screen);
         else
             convertTo(*screen);
-        SDL_UpdateWindowSurface(window_);
+        SDL_UpdateWindowSurface(sdl());
     }
 
  private:
@@ -78,7 +77,10 @@ class SdlFrontEnd::DesktopWindow {
         SDL_FreeSurface(source);
     }
 
-    SDL_Window* window_;
+    struct Destroy {
+        void operator()(SDL_Window* window) const { SDL_DestroyWindow(window); }
+    };
+    std::unique_ptr<SDL_Window, Destroy> window_;
     Surface picture_;
 };
 
@@ -101,6 +103,7 @@ std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
 
 SdlFrontEnd::~SdlFrontEnd() {
     windows_.clear();
+    icon_.reset();
     SDL_Quit();
 }
 
@@ -142,9 +145,10 @@ void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
 }
 
 void SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
-    const DesktopWindow* owner = find(traits.owner);
-    windows_[window] =
-        std::make_unique<DesktopWindow>(traits, placeOf(traits), owner == nullptr ? nullptr : owner->sdl());
+    auto made = std::make_unique<DesktopWindow>(traits, placeOf(traits), find(traits.owner));
+    if (icon_ && made->sdl() != nullptr)
+        SDL_SetWindowIcon(made->sdl(), icon_.get());
+    windows_[window] = std::move(made);
 }
 
 Point SdlFrontEnd::placeOf(const NativeWindow& traits) {
@@ -175,6 +179,17 @@ void SdlFrontEnd::minimiseWindow(WindowId window) {
         SDL_MinimizeWindow(shown->sdl());
 }
 
+void SdlFrontEnd::setIcon(const Icon& icon) {
+    SDL_Surface* borrowed =
+        SDL_CreateRGBSurfaceWithFormatFrom(const_cast<unsigned char*>(icon.rgba.data()), icon.size.width,
+                                           icon.size.height, 32, icon.size.width * 4, SDL_PIXELFORMAT_RGBA32);
+    icon_.reset(borrowed);
+}
+
+void SdlFrontEnd::FreeSurface::operator()(SDL_Surface* surface) const {
+    SDL_FreeSurface(surface);
+}
+
 Size SdlFrontEnd::screenSize() {
     SDL_Rect bounds{};
     SDL_GetDisplayBounds(0, &bounds);
@@ -192,7 +207,7 @@ SdlFrontEnd::DesktopWindow* SdlFrontEnd::find(WindowId window) {
 }
 
 WindowId SdlFrontEnd::idOf(std::uint32_t sdlWindow) const {
-    const auto found = std::find_if(windows_.begin(), windows_.end(), [&](const auto& window) {
+    const auto found = std::ranges::find_if(windows_, [&](const auto& window) {
         return window.second->sdl() != nullptr && SDL_GetWindowID(window.second->sdl()) == sdlWindow;
     });
     return found == windows_.end() ? WindowId::none : found->first;

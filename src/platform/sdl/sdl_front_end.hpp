@@ -7,6 +7,8 @@
 #include "platform/front_end.hpp"
 #include "platform/message_loop.hpp"
 
+struct SDL_Surface;
+
 namespace quabble {
 
 // The desktop, by way of SDL 2.
@@ -24,11 +26,15 @@ class SdlFrontEnd final : public FrontEnd {
     void showPixels(WindowId window, const Surface& picture) override;
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
+    void setIcon(const Icon& icon) override;
     Size screenSize() override;
     std::string executableFolder() override;
 
  private:
     class DesktopWindow;
+    struct FreeSurface {
+        void operator()(SDL_Surface* surface) const;
+    };
 
     SdlFrontEnd() = default;
     DesktopWindow* find(WindowId window);
@@ -37,6 +43,7 @@ class SdlFrontEnd final : public FrontEnd {
     void waitForEvents(MessageLoop& loop);
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
+    std::unique_ptr<SDL_Surface, FreeSurface> icon_;
 };
 
 }  // namespace quabble
