@@ -1,0 +1,122 @@
+#include "desktop.hpp"
+
+#include <X11/Xlib.h>
+#include <X11/Xutil.h>
+#include <X11/extensions/XTest.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <thread>
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr auto patience = 10s;
+constexpr auto reactionTime = 150ms;  // a window manager may need some of it to take a closed window away
+
+}  // namespace
+
+void require(bool condition, const std::string& what) {
+    if (condition)
+        return;
+    std::fprintf(stderr, "FAILED: %s\n", what.c_str());
+    std::exit(EXIT_FAILURE);
+}
+
+void waitUntil(const std::string& what, const std::function<bool()>& isSo) {
+    const auto end = std::chrono::steady_clock::now() + patience;
+    while (!isSo()) {
+        require(std::chrono::steady_clock::now() < end, "waited in vain: " + what);
+        std::this_thread::sleep_for(10ms);
+    }
+}
+
+Desktop::Desktop() : display_(XOpenDisplay(nullptr)), root_(None) {
+    require(display_ != nullptr, "a display");
+    root_ = DefaultRootWindow(display_);
+    // A window may go between being found and being looked at.
+    XSetErrorHandler([](Display*, XErrorEvent*) { return 0; });
+}
+
+Desktop::~Desktop() {
+    XCloseDisplay(display_);
+}
+
+::Window Desktop::waitForWindow(const std::string& caption) {
+    ::Window found = None;
+    waitUntil("the window " + caption, [&] {
+        found = find(root_, caption);
+        XWindowAttributes attributes{};
+        return found != None && XGetWindowAttributes(display_, found, &attributes) != 0 &&
+               attributes.map_state == IsViewable;
+    });
+    return found;
+}
+
+::Window Desktop::find(::Window below, const std::string& caption) {
+    char* name = nullptr;
+    if (XFetchName(display_, below, &name) != 0 && name != nullptr) {
+        const bool matches = caption == name;
+        XFree(name);
+        if (matches)
+            return below;
+    }
+    ::Window root = None;
+    ::Window parent = None;
+    ::Window* children = nullptr;
+    unsigned count = 0;
+    ::Window found = None;
+    if (XQueryTree(display_, below, &root, &parent, &children, &count) != 0) {
+        for (unsigned i = 0; i < count && found == None; ++i)
+            found = find(children[i], caption);
+        if (children != nullptr)
+            XFree(children);
+    }
+    return found;
+}
+
+void Desktop::click(::Window window, int x, int y) {
+    std::this_thread::sleep_for(reactionTime);
+    int screenX = 0;
+    int screenY = 0;
+    ::Window child = None;
+    XTranslateCoordinates(display_, window, root_, x, y, &screenX, &screenY, &child);
+    XTestFakeMotionEvent(display_, -1, screenX, screenY, CurrentTime);
+    XTestFakeButtonEvent(display_, 1, True, CurrentTime);
+    XTestFakeButtonEvent(display_, 1, False, CurrentTime);
+    XSync(display_, False);
+}
+
+// The last button of the title bar that the window manager has put above the window.
+void Desktop::clickCloseButton(::Window window) {
+    XWindowAttributes attributes{};
+    XGetWindowAttributes(display_, window, &attributes);
+    click(window, attributes.width - 10, -10);
+}
+
+void Desktop::press(KeySym keysym) {
+    const KeyCode code = XKeysymToKeycode(display_, keysym);
+    XTestFakeKeyEvent(display_, code, True, CurrentTime);
+    XTestFakeKeyEvent(display_, code, False, CurrentTime);
+    XSync(display_, False);
+}
+
+Surface Desktop::look(::Window window) {
+    XWindowAttributes attributes{};
+    XGetWindowAttributes(display_, window, &attributes);
+    Surface seen(attributes.width, attributes.height);
+    XImage* image = XGetImage(display_, window, 0, 0, static_cast<unsigned>(attributes.width),
+                              static_cast<unsigned>(attributes.height), AllPlanes, ZPixmap);
+    require(image != nullptr, "a picture of the window");
+    for (int y = 0; y < attributes.height; ++y) {
+        for (int x = 0; x < attributes.width; ++x)
+            seen.row(y)[static_cast<std::size_t>(x)] =
+                static_cast<std::uint32_t>(XGetPixel(image, x, y)) & 0xFFFFFF;
+    }
+    XDestroyImage(image);
+    return seen;
+}
+
+}  // namespace quabble

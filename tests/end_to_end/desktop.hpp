@@ -1,0 +1,46 @@
+#pragma once
+
+#include <chrono>
+#include <functional>
+#include <string>
+
+#include "platform/surface.hpp"
+
+struct _XDisplay;
+
+namespace quabble {
+
+using WindowOnScreen = unsigned long;  // the X server's number of it, 0 for none
+
+// A person at the desktop: sees the screen and moves a real pointer and real keys.
+class Desktop {
+ public:
+    Desktop();
+    ~Desktop();
+    Desktop(const Desktop&) = delete;
+    Desktop& operator=(const Desktop&) = delete;
+
+    // The window with this caption; fails the run when none comes within ten seconds.
+    WindowOnScreen waitForWindow(const std::string& caption);
+    bool hasWindow(const std::string& caption) { return find(root_, caption) != 0; }
+
+    void click(WindowOnScreen window, int x, int y);
+    void clickCloseButton(WindowOnScreen window);
+    void press(unsigned long keysym);
+
+    // What is seen of a window's client area.
+    Surface look(WindowOnScreen window);
+
+ private:
+    WindowOnScreen find(WindowOnScreen below, const std::string& caption);
+
+    _XDisplay* display_;
+    WindowOnScreen root_;
+};
+
+// Asks again and again until the answer is yes; fails the run when it is not within ten seconds.
+void waitUntil(const std::string& what, const std::function<bool()>& isSo);
+
+void require(bool condition, const std::string& what);
+
+}  // namespace quabble
