@@ -12,7 +12,7 @@
 namespace quabble {
 namespace {
 
-constexpr std::int32_t twipsPerPixel = 15;
+constexpr std::int32_t twipsPerPixel = 15;  // a twip is 1/1440 inch
 
 // The first box that the point hits, of those that are buttons.
 std::optional<std::size_t> buttonAt(const ButtonSet& boxes, float x, float y) {
@@ -39,9 +39,9 @@ MainWindow::MainWindow(AppState& app)
 }
 
 void MainWindow::Form_Load() {
-    myHt_ = roundHalfEven(layoutUnit * 12.5 * twipsPerPixel);
-    myWid_ = layoutUnit * 15 * twipsPerPixel;
-    setClientSize({myWid_ / twipsPerPixel, myHt_ / twipsPerPixel});
+    const std::int32_t myHt = roundHalfEven(layoutUnit * 12.5 * twipsPerPixel);
+    const std::int32_t myWid = layoutUnit * 15 * twipsPerPixel;
+    setClientSize({myWid / twipsPerPixel, myHt / twipsPerPixel});
     setPosition({(app_.loop.frontEnd().screenSize().width - clientSize().width) / 2, 0});
     setCaption(std::string(applicationTitle) + "  Ver " + std::to_string(majorVersion) + "." +
                std::to_string(minorVersion));

@@ -74,8 +74,6 @@ class MainWindow final : public Window, private Stage {
     Game game_;
     Timer timerBlocks_;
     Label lblPause_;
-    std::int32_t myHt_ = 0;  // the window's size in twips, 1/1440 inch, fixed when it loads
-    std::int32_t myWid_ = 0;
     bool gamePaused_ = false;
 
     ScreenButton backgroundBox_;

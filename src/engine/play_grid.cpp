@@ -36,8 +36,8 @@ bool PlayGrid::clusterAtLeast(CellPosition place, std::int16_t minimum) {
 }
 
 void PlayGrid::resetMarks() {
-    std::ranges::transform(cells_, clusterMarks_.begin(),
-                           [](const GridCell& cell) { return static_cast<std::uint8_t>(cell.colour); });
+    for (std::size_t i = 0; i < cellCount; ++i)
+        clusterMarks_[i] = static_cast<std::uint8_t>(cells_[i].colour);
 }
 
 std::int16_t PlayGrid::markCluster(CellPosition start) {
@@ -49,8 +49,8 @@ std::int16_t PlayGrid::markCluster(CellPosition start) {
     clusterStack_[top++] = start;
     while (top > 0) {
         const CellPosition place = clusterStack_[--top];
-        for (const Direction direction : allDirections) {
-            const CellPosition next = neighbour(place, direction);
+        for (std::size_t direction = 1; direction <= dirCol.size(); ++direction) {
+            const CellPosition next = neighbour(place, static_cast<Direction>(direction));
             if (!isInGrid(next) || clusterMarks_[index(next)] == markValue || at(next).colour != colour)
                 continue;
             clusterMarks_[index(next)] = markValue;

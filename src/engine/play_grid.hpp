@@ -10,10 +10,9 @@ namespace quabble {
 constexpr std::int16_t maxGridCols = 12;
 constexpr std::int16_t maxGridRows = 16;
 
-// The four directions in the order in which the cluster search looks at neighbours.
+// The four directions in the order in which the cluster search looks at neighbours, and the step that each
+// is.
 enum class Direction : std::int16_t { Right = 1, Down = 2, Left = 3, Up = 4 };
-constexpr std::array<Direction, 4> allDirections{Direction::Right, Direction::Down, Direction::Left,
-                                                 Direction::Up};
 constexpr std::array<std::int16_t, 4> dirCol{1, 0, -1, 0};
 constexpr std::array<std::int16_t, 4> dirRow{0, 1, 0, -1};
 

@@ -1,0 +1,125 @@
+#include "game_fixture.hpp"
+
+namespace quabble {
+namespace {
+
+class RowsAndLevels : public GameFixture {};
+
+TEST_F(RowsAndLevels, TwelveTicksOrAClickOnTheStripPushTheRow) {
+    play(GameMode::Timed, ".....4");
+    for (int i = 1; i <= 11; ++i) {
+        run(tick());
+        EXPECT_EQ(stage.takeLines(), lines("strip=" + std::to_string(i) + ":123123123123 present"));
+    }
+    run(tick());
+    EXPECT_EQ(stage.takeLines(),
+              lines("gauge=2.08333 board=.....4/123123123123 strip=0:222222222222 present"));
+    for (int i = 1; i <= 5; ++i)
+        run(tick());
+    stage.takeLines();
+    run(pushRow());
+    EXPECT_TRUE(rowAccepted);
+    EXPECT_EQ(stage.takeLines(),
+              lines("gauge=4.16667 board=.....4/123123123123/222222222222 strip=0:222222222222 present"));
+    run(tick());
+    EXPECT_EQ(stage.takeLines(), lines("strip=1:222222222222 present"));
+    run(game.endGame());
+    stage.takeLines();
+    run(tick());
+    EXPECT_EQ(stage.takeLines(), "");
+}
+
+TEST_F(RowsAndLevels, RowIsRefusedOnlyWhileTheTopRowIsOccupied) {
+    std::string tower = "...111S";
+    for (int i = 2; i <= 15; ++i)
+        tower = (i % 2 == 0 ? "......3/" : "......4/") + tower;
+    play(GameMode::Strategy, tower);
+    run(click({5, 16}));
+    EXPECT_TRUE(state.arcadeActive);
+    EXPECT_TRUE(state.grid.isTopRowOccupied());
+    EXPECT_TRUE(stage.takeLines().ends_with("present\n"));
+    run(pushRow());
+    EXPECT_FALSE(rowAccepted);
+    EXPECT_EQ(stage.takeLines(), lines("timer=off result:1,6,3,3 timer=off menu"));
+    EXPECT_TRUE(isAtMenu());
+
+    play(GameMode::Strategy, "......4/" + tower + "S");
+    run(click({5, 16}));
+    EXPECT_TRUE(stage.takeLines().ends_with(lines("pause=100 timer=off result:1,6,3,3 timer=off menu")));
+    EXPECT_EQ(state.grid.at({7, 16}), GridCell::stone());
+    EXPECT_EQ(state.rowsEntered, 0);
+    EXPECT_TRUE(isAtMenu());
+}
+
+TEST_F(RowsAndLevels, LevelIsCompleteWhenItsLastRowHasEntered) {
+    for (const GameMode mode : {GameMode::Timed, GameMode::Strategy}) {
+        for (std::int16_t level = 1; level < 10; ++level) {
+            play(mode, ".....4");
+            skipToLastRowOf(level);
+            state.stats = {1000, 30, 7, level, 0};
+            state.tickCount = 11;
+            run(mode == GameMode::Timed ? tick() : pushRow());
+            const ArcadeLevelSpec& next = levelTable[static_cast<std::int16_t>(level + 1)];
+            const std::string row = fullRows(1, level < 2 ? '2' : '4');
+            const std::string newBoard = fullRows(next.startRows, row[0]);
+            EXPECT_EQ(
+                stage.takeLines(),
+                lines("gauge=100 board=.....4/123123123123 strip=0:" + fullRows(1, level < 3 ? '2' : '4') +
+                      " timer=off present completed:" + std::to_string(level) + ",1000,30,7 " +
+                      (mode == GameMode::Timed
+                           ? "interval=" + std::to_string(next.tickInterval()) + " timer=on"
+                           : "timer=off") +
+                      " play-panel board=" + newBoard + " strip=0:" + row +
+                      " gauge=0 level=" + std::to_string(level + 1) + " present present"));
+            EXPECT_EQ(state.stats.score, 1000);
+            EXPECT_EQ(state.stats.blocksCleared + state.stats.largestCluster + state.rowsEntered, 0);
+            EXPECT_TRUE(state.arcadeActive);
+        }
+    }
+}
+
+TEST_F(RowsAndLevels, TenthLevelWinsTheGameAndLeavesTheMenuAlone) {
+    for (const GameMode mode : {GameMode::Timed, GameMode::Strategy}) {
+        for (const Action& act : {clickStrip, tick, clickCell({5, 16})}) {
+            play(mode, "......S/....1112");
+            skipToLastRowOf(10);
+            state.tickCount = 11;
+            state.stats.score = 90;
+            run(act());
+            const std::string recorded = stage.takeLines();
+            if (state.isGameActive())  // a Timed move brings no row
+                continue;
+            EXPECT_TRUE(recorded.ends_with(lines("timer=off menu present"))) << recorded;
+            EXPECT_EQ(countOf("completed:10,9", recorded), 1);
+            EXPECT_EQ(countOf("result:11,9", recorded), 1);
+            EXPECT_EQ(countOf(",0,0\ntimer=off\nmenu", recorded), 1) << recorded;
+            EXPECT_TRUE(isAtMenu());
+        }
+    }
+}
+
+TEST_F(RowsAndLevels, StrategyMoveThatCompletesALevelLeavesTheNewBoardAlone) {
+    play(GameMode::Strategy, "...111");
+    skipToLastRowOf(4);
+    random.value = 0.03;  // nothing but stones on level 5
+    run(click({5, 16}));
+    EXPECT_EQ(show(state.grid), fullRows(6, 'S'));
+    EXPECT_EQ(state.rowsEntered, 0);
+    EXPECT_TRUE(stage.takeLines().ends_with(lines("level=5 present present")));
+    EXPECT_TRUE(state.arcadeActive && !state.boolProcessing);
+}
+
+TEST_F(RowsAndLevels, EndGameActsAtOnceAndNothingReachesTheGameBehindTheResult) {
+    for (const GameMode mode : {GameMode::Training, GameMode::Timed, GameMode::Strategy}) {
+        play(mode, ".....1112S");
+        stage.inDialogs = {{endGame, clickCell({6, 16}), clickCell({9, 16}), tick}};
+        run(game.endGame());
+        run(game.endGame());
+        run(click({6, 16}));
+        EXPECT_EQ(stage.takeLines(), lines("timer=off result:1,0,0,0 timer=off menu"));
+        EXPECT_TRUE(isAtMenu());
+    }
+}
+
+}  // namespace
+}  // namespace quabble

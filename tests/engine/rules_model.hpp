@@ -1,0 +1,187 @@
+#pragma once
+
+#include <algorithm>
+#include <map>
+#include <set>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "board_notation.hpp"
+#include "engine/game_stats.hpp"
+
+namespace quabble::model {
+
+// The rules once more, as plainly as they can be said and without a thought for speed, to hold the engine
+// against. A board is the letters of its occupied places, (column, row).
+using Place = std::pair<int, int>;
+using Places = std::set<Place>;
+using Board = std::map<Place, char>;
+
+inline Board read(const PlayGrid& grid) {
+    Board board;
+    grid.forEachCell([&](CellPosition place, const GridCell& cell) {
+        if (letterOf(cell) != '.')
+            board[{place.column, place.row}] = letterOf(cell);
+    });
+    return board;
+}
+
+inline int colourOf(char letter) {
+    if (letter == 'S')
+        return 5;
+    return letter >= 'a' ? letter - 'a' + 1 : letter - '0';
+}
+
+inline Places placesOfColour(const Board& board, int colour) {
+    Places places;
+    for (const auto& [place, letter] : board) {
+        if (colourOf(letter) == colour)
+            places.insert(place);
+    }
+    return places;
+}
+
+inline void reach(Place place, const Places& colour, Places& reached) {
+    if (!colour.contains(place) || !reached.insert(place).second)
+        return;
+    const auto [column, row] = place;
+    reach({column, row - 1}, colour, reached);
+    reach({column, row + 1}, colour, reached);
+    reach({column - 1, row}, colour, reached);
+    reach({column + 1, row}, colour, reached);
+}
+
+inline Places cluster(const Board& board, Place place) {
+    Places reached;
+    reach(place, placesOfColour(board, colourOf(board.at(place))), reached);
+    return reached;
+}
+
+inline bool isAnyMoveLeft(const Board& board) {
+    return std::any_of(board.begin(), board.end(),
+                       [&](const auto& cell) { return cluster(board, cell.first).size() >= 2; });
+}
+
+inline Board without(Board board, const Places& places) {
+    for (const Place& place : places)
+        board.erase(place);
+    return board;
+}
+
+// From the top of each column, the stones down to the first cell that is none.
+inline Places exposedStones(const Board& board) {
+    Places exposed;
+    int covered = 0;
+    for (const auto& [place, letter] : board) {  // column by column, from the top
+        if (letter != 'S')
+            covered = place.first;
+        else if (covered != place.first)
+            exposed.insert(place);
+    }
+    return exposed;
+}
+
+// The letters of the columns from the bottom up, whatever gaps lie between them.
+using Piles = std::map<int, std::string>;
+
+inline Piles piles(const Board& board) {
+    Piles result;
+    for (const auto& [place, letter] : board)
+        result[place.first].insert(0, 1, letter);
+    return result;
+}
+
+inline Board stacked(const Piles& piles) {
+    Board board;
+    for (const auto& [column, letters] : piles) {
+        for (std::size_t i = 0; i < letters.size(); ++i)
+            board[{column, 16 - static_cast<int>(i)}] = letters[i];
+    }
+    return board;
+}
+
+inline Board fallen(const Board& board) {
+    return stacked(piles(board));
+}
+
+// The piles side by side: those of the left half reach up to column 6, and the others begin beside them, or
+// in column 6 when there are none.
+inline Board closed(const Board& board) {
+    const Piles before = piles(board);
+    const auto left =
+        std::count_if(before.begin(), before.end(), [](const auto& pile) { return pile.first <= 6; });
+    int column = left == 0 ? 6 : 7 - static_cast<int>(left);
+    Piles after;
+    for (const auto& pile : before)
+        after[column++] = pile.second;
+    return stacked(after);
+}
+
+inline bool isTopRowOccupied(const Board& board) {
+    return std::any_of(board.begin(), board.end(), [](const auto& cell) { return cell.first.second == 1; });
+}
+
+// A running game.
+struct Game {
+    GameMode mode;
+    Board board;
+    GameStats stats;
+    int rowsEntered = 0;
+    bool isOver = false;
+    bool isNewLevel = false;  // whose board is not known yet
+
+    void click(Place place, const std::string& nextRow) {
+        if (!board.contains(place) || (board.at(place) == 'S' && mode != GameMode::Training))
+            return;
+        const char letter = board.at(place);
+        const Places reached = cluster(board, place);
+        if (mode == GameMode::Training) {
+            if (reached.size() >= 2)
+                remove(reached);
+            isOver = !isAnyMoveLeft(board);
+            return;
+        }
+        const bool isBomb = letter >= 'a';
+        if (isBomb) {
+            board = closed(fallen(without(board, placesOfColour(board, colourOf(letter)))));
+            release();
+        } else if (reached.size() >= 3) {
+            remove(reached);
+        }
+        const bool bringsRow = mode == GameMode::Strategy && (isBomb || reached.size() >= 3);
+        if (!bringsRow || push(nextRow))
+            release();
+    }
+
+    // False when the game or the level has ended.
+    bool push(const std::string& nextRow) {
+        isOver = isTopRowOccupied(board);
+        if (isOver)
+            return false;
+        Piles grown = piles(board);
+        for (int column = 1; column <= 12; ++column)
+            grown[column].insert(0, 1, nextRow.at(static_cast<std::size_t>(column - 1)));
+        board = stacked(grown);
+        ++rowsEntered;
+        if (rowsEntered < 45 + 3 * stats.level)
+            return true;
+        stats.blocksCleared = stats.largestCluster = 0;
+        isOver = stats.level++ == 10;
+        isNewLevel = !isOver;
+        return false;
+    }
+
+ private:
+    void remove(const Places& places) {
+        const auto size = static_cast<std::int32_t>(places.size());
+        for (std::int32_t i = 1; i <= size; ++i)
+            stats.score += i;
+        stats.blocksCleared += size;
+        stats.largestCluster = std::max(stats.largestCluster, size);
+        board = closed(fallen(without(board, places)));
+    }
+    void release() { board = closed(without(board, exposedStones(board))); }
+};
+
+}  // namespace quabble::model

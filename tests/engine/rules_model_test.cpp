@@ -1,0 +1,132 @@
+#include "rules_model.hpp"
+
+#include <gtest/gtest.h>
+
+#include "engine/game.hpp"
+#include "quiet_stage.hpp"
+
+namespace quabble {
+namespace {
+
+// A whole number from 0 to below the limit.
+template <typename Limit>
+int drawBelow(Limit limit, RandomSource& random) {
+    return static_cast<int>(random.next() * static_cast<double>(limit));
+}
+
+CellPosition positionOf(model::Place place) {
+    return {static_cast<std::int16_t>(place.first), static_cast<std::int16_t>(place.second)};
+}
+
+TEST(RulesModel, AgreesWithTheEngineOnScatteredBoards) {
+    const std::string letters = "1111222233344abcSS";
+    SeededRandom random(11);
+    for (int i = 0; i < 2000 && !testing::Test::HasFailure(); ++i) {
+        const double density = random.next();
+        PlayGrid grid = board("");
+        grid.forEachCell([&](CellPosition, GridCell& cell) {
+            if (random.next() < density)
+                cell = cellOf(letters[static_cast<std::size_t>(drawBelow(letters.size(), random))]);
+        });
+        const model::Board cells = model::read(grid);
+        SCOPED_TRACE(show(grid));
+        EXPECT_EQ(grid.noMovesLeft(), !model::isAnyMoveLeft(cells));
+        EXPECT_EQ(grid.isTopRowOccupied(), model::isTopRowOccupied(cells));
+        for (const model::Place& stone : model::placesOfColour(cells, 5))
+            EXPECT_EQ(grid.isStoneExposed(positionOf(stone)), model::exposedStones(cells).contains(stone));
+        if (cells.empty())
+            continue;
+        const model::Place clicked = std::next(cells.begin(), drawBelow(cells.size(), random))->first;
+        const model::Places cluster = model::cluster(cells, clicked);
+        EXPECT_TRUE(grid.clusterAtLeast(positionOf(clicked), static_cast<std::int16_t>(cluster.size())));
+        EXPECT_EQ(grid.removeMarked(), std::ssize(cluster));
+        EXPECT_EQ(model::read(grid), model::without(cells, cluster));
+        const model::Board fallen = model::fallen(model::without(cells, cluster));
+        grid.dropBlocks(Direction::Down);
+        EXPECT_EQ(model::read(grid), fallen);
+        EXPECT_EQ(grid.closeColumns(), model::closed(fallen) != fallen);
+        EXPECT_EQ(model::read(grid), model::closed(fallen));
+    }
+}
+
+// Out of a few places the one with the biggest cluster, or a bomb, to stay in the game; now and then any
+// place.
+model::Place choosePlace(const model::Board& cells, RandomSource& random) {
+    model::Place best{1 + drawBelow(12, random), 16 - drawBelow(8, random)};
+    const int tries = cells.empty() ? 0 : drawBelow(12, random);
+    std::size_t most = 0;
+    for (int i = 0; i < tries; ++i) {
+        const auto [place, letter] = *std::next(cells.begin(), drawBelow(cells.size(), random));
+        const std::size_t gain = letter >= 'a' ? 30 : model::cluster(cells, place).size();
+        if (letter != 'S' && gain > most) {
+            most = gain;
+            best = place;
+        }
+    }
+    return best;
+}
+
+// Plays one game to its end, on the engine and on the model, and returns its last level.
+int playWholeGame(GameMode mode, std::uint64_t seed) {
+    SeededRandom rows(seed);
+    SeededRandom player(seed + 1);
+    GameState state;
+    HighScores highScores;
+    const LevelTable levelTable;
+    QuietStage stage(state);
+    Game game(state, highScores, levelTable, rows, stage);
+    state.gameMode = mode;
+    state.scoreTableIndex = static_cast<std::int16_t>(mode);
+    const bool isArcade = mode != GameMode::Training;
+    if (isArcade)
+        game.startArcadeGame().start();
+    else
+        game.startStandardGame();
+
+    model::Game expected{mode, model::read(state.grid), state.stats};
+    while (!expected.isOver && !testing::Test::HasFailure()) {
+        const std::string nextRow = show(state.nextRow);
+        const model::Place place = choosePlace(expected.board, player);
+        SCOPED_TRACE("seed " + std::to_string(seed) + ", " + std::to_string(place.first) + "," +
+                     std::to_string(place.second) + " of " + show(state.grid) + ", then " + nextRow);
+        if (isArcade && drawBelow(10, player) == 0)  // leave out most of the level
+            state.rowsEntered = expected.rowsEntered = 42 + 3 * state.stats.level;
+        if (isArcade && drawBelow(mode == GameMode::Timed ? 3 : 12, player) == 0) {
+            game.putnextRow().start();
+            expected.push(nextRow);
+        } else {
+            const CellPosition cell = positionOf(place);
+            game.gameBoardClick(static_cast<std::int16_t>(cell.column * 28 - 14),
+                                static_cast<std::int16_t>(cell.row * 28 - 14))
+                .start();
+            expected.click(place, nextRow);
+        }
+        if (expected.isNewLevel) {
+            expected.isNewLevel = false;
+            expected.rowsEntered = 0;
+            expected.board = model::read(state.grid);
+            EXPECT_EQ(std::ssize(expected.board), 12 * levelTable[state.stats.level].startRows);
+            EXPECT_EQ(expected.board, model::fallen(expected.board));
+        }
+        EXPECT_EQ(model::read(state.grid), expected.board);
+        EXPECT_EQ(state.stats.score, expected.stats.score);
+        EXPECT_EQ(state.stats.blocksCleared, expected.stats.blocksCleared);
+        EXPECT_EQ(state.stats.largestCluster, expected.stats.largestCluster);
+        EXPECT_EQ(state.stats.level, expected.stats.level);
+        EXPECT_EQ(state.rowsEntered, expected.rowsEntered);
+        EXPECT_EQ(state.isGameActive(), !expected.isOver);
+    }
+    return state.stats.level;
+}
+
+TEST(RulesModel, AgreesWithTheEngineOverWholeGames) {
+    int won = 0;
+    for (std::uint64_t seed = 1; seed <= 80; ++seed) {
+        for (const GameMode mode : {GameMode::Training, GameMode::Timed, GameMode::Strategy})
+            won += playWholeGame(mode, seed) > lastLevel ? 1 : 0;
+    }
+    EXPECT_GE(won, 5) << "the higher levels are hardly tried";
+}
+
+}  // namespace
+}  // namespace quabble
