@@ -12,6 +12,11 @@
 #include "gfx/result_dialog.hpp"
 #include "gfx/sprite_sheet.hpp"
 #include "platform/message_loop.hpp"
+#include "platform/registry.hpp"
+#include "store/name_entry.hpp"
+#include "store/score_view.hpp"
+#include "store/settings_store.hpp"
+#include "store/version.hpp"
 
 namespace quabble {
 
@@ -20,24 +25,37 @@ constexpr std::int16_t layoutUnit = 45;  // pixels; the windows' layouts are mul
 // Everything that lives as long as the program: the game, the tables, the pictures and one of each window.
 class AppState {
  public:
-    // The loop must outlive the state.
-    AppState(MessageLoop& messageLoop, std::uint64_t seed);
+    // The loop and the registry must outlive the state.
+    AppState(MessageLoop& messageLoop, Registry& userRegistry, std::uint64_t seed);
 
     MessageLoop& loop;
+    Registry& registry;
     SeededRandom random;
     std::string programFolder;  // of the running program, ending in a separator
     LevelTable levelTable;
     GameState game;
     HighScores highScores;
+    Settings settings;
     Pictures pictures;
 
     // Each window is made when it is first used.
     MainWindow& frmQuabble();
     ResultDialog& diagWow();
+    NameEntry& diagUN();
+    ScoreView& frmStats();
+
+    // Hands a file or an address to the desktop; what becomes of it is not our business.
+    void openDocument(const std::string& document);
+
+    // The settings as the registry has them, and back.
+    void load();
+    void save();
 
  private:
     std::unique_ptr<MainWindow> frmQuabble_;
     std::unique_ptr<ResultDialog> diagWow_;
+    std::unique_ptr<NameEntry> diagUN_;
+    std::unique_ptr<ScoreView> frmStats_;
 };
 
 }  // namespace quabble

@@ -117,4 +117,14 @@ Task<> MainWindow::showResult(bool goNextLevel) {
     diagWow.goNextLevel = false;
 }
 
+Task<std::string> MainWindow::enterName() {
+    co_await loop().showModal(app_.diagUN());
+    co_return app_.diagUN().nameEntered();
+}
+
+Task<> MainWindow::showHighScores(std::int16_t tableIndex) {
+    app_.frmStats().modeNum = tableIndex;
+    co_await loop().showModal(app_.frmStats());
+}
+
 }  // namespace quabble

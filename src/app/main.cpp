@@ -16,7 +16,8 @@ int main() {
     }
     const auto clock = std::chrono::system_clock::now().time_since_epoch().count();
     quabble::MessageLoop loop(*frontEnd);
-    quabble::AppState app(loop, static_cast<std::uint64_t>(clock));
+    quabble::Registry registry(quabble::userRegistryPath("quabble"));
+    quabble::AppState app(loop, registry, static_cast<std::uint64_t>(clock));
     quabble::Task<> program = quabble::runProgram(app);
     program.start();
     frontEnd->run(loop);

@@ -4,7 +4,6 @@
 #include <optional>
 
 #include "app/app_state.hpp"
-#include "app/version.hpp"
 #include "base/round_half_even.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/string_table.hpp"
@@ -43,8 +42,7 @@ void MainWindow::Form_Load() {
     const std::int32_t myWid = layoutUnit * 15 * twipsPerPixel;
     setClientSize({myWid / twipsPerPixel, myHt / twipsPerPixel});
     setPosition({(app_.loop.frontEnd().screenSize().width - clientSize().width) / 2, 0});
-    setCaption(std::string(applicationTitle) + "  Ver " + std::to_string(majorVersion) + "." +
-               std::to_string(minorVersion));
+    setCaption(std::string(applicationTitle) + "  Ver " + versionText());
     canvas().font.face = Typeface::SansBold;
     backgroundBox_ = layOutBackground(canvas());
     fillBox(backgroundBox_);
@@ -57,6 +55,7 @@ void MainWindow::Form_Load() {
 }
 
 void MainWindow::Form_Unload() {
+    app_.save();
     app_.loop.end();
 }
 

@@ -44,6 +44,7 @@ class MainWindow final : public Window, private Stage {
     Task<> mainMenuClick(std::size_t clickedBtnNum);
     Task<> standardMenuClick(std::size_t clickedBtnNum);
     Task<> arcadeMenuClick(std::size_t clickedBtnNum);
+    void openHelp();
     void highlightUnderPointer(ButtonSet& buttons, std::uint16_t captionBase, float x, float y);
     void drawPanel(ButtonSet& entries, std::uint16_t captionBase);
     void drawValue(ScreenButton& box, std::int32_t value, bool highlighted);
@@ -69,6 +70,8 @@ class MainWindow final : public Window, private Stage {
     void switchBlockTimer(bool on) override;
     void setBlockTimerInterval(std::chrono::milliseconds interval) override;
     Task<> showResult(bool goNextLevel) override;
+    Task<std::string> enterName() override;
+    Task<> showHighScores(std::int16_t tableIndex) override;
 
     AppState& app_;
     Game game_;

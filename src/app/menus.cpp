@@ -45,6 +45,14 @@ Task<> MainWindow::mainMenuClick(std::size_t clickedBtnNum) {
             app_.game.scoreTableIndex = number;
             co_await game_.startArcadeGame();
             break;
+        case 4:
+        case 5:
+        case 6:
+            co_await showHighScores(static_cast<std::int16_t>(number - 3));
+            break;
+        case 7:
+            openHelp();
+            break;
         case 8:
             unload();
             break;
@@ -53,10 +61,17 @@ Task<> MainWindow::mainMenuClick(std::size_t clickedBtnNum) {
     }
 }
 
+void MainWindow::openHelp() {
+    app_.openDocument(app_.programFolder + "QB_HELP.HTM");
+}
+
 Task<> MainWindow::standardMenuClick(std::size_t clickedBtnNum) {
     switch (clickedBtnNum) {
         case 6:
             enablePause(true);
+            break;
+        case 7:
+            openHelp();
             break;
         case 8:
             co_await game_.endGame();
@@ -70,6 +85,9 @@ Task<> MainWindow::arcadeMenuClick(std::size_t clickedBtnNum) {
     switch (clickedBtnNum) {
         case 8:
             enablePause(true);
+            break;
+        case 9:
+            openHelp();
             break;
         case 10:
             co_await game_.endGame();

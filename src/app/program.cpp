@@ -3,6 +3,7 @@
 #include <filesystem>
 
 #include "app/icon.hpp"
+#include "app/splash.hpp"
 
 namespace quabble {
 namespace {
@@ -15,10 +16,14 @@ std::string withSeparator(std::string folder) {
     return folder;
 }
 
-void Main(AppState& app) {
+Task<> Main(AppState& app) {
     app.loop.frontEnd().setIcon(applicationIcon());
     app.programFolder = withSeparator(app.loop.frontEnd().executableFolder());
+    app.load();
     app.pictures = loadGraphics(app.programFolder);
+    Splash splash(app);
+    co_await app.loop.showModal(splash);
+    app.settings.solvingData.setSplashSeen();
     app.frmQuabble().show();
     app.frmQuabble().showMainMenu();
 }
@@ -26,7 +31,7 @@ void Main(AppState& app) {
 }  // namespace
 
 Task<> runProgram(AppState& app) {
-    Main(app);
+    co_await Main(app);
     co_await app.loop.run();
 }
 

@@ -1,5 +1,8 @@
 #include "engine/game.hpp"
 
+#include <string>
+#include <utility>
+
 #include "engine/play_grid.hpp"
 
 namespace quabble {
@@ -33,7 +36,14 @@ Task<> Game::gameOver() {
     state_.classicActive = false;
     state_.arcadeActive = false;
     stage_.switchBlockTimer(false);
+    const std::int16_t table = state_.scoreTableIndex;
+    const std::int16_t place = highScores_.rankOf(table, state_.stats.score);
     co_await stage_.showResult(false);
+    if (place <= highScorePlaces) {
+        std::string name = co_await stage_.enterName();
+        highScores_.insertHighScore(table, state_.stats.score, std::move(name));
+        co_await stage_.showHighScores(table);
+    }
     stage_.switchBlockTimer(false);
     stage_.showMainMenu();
 }

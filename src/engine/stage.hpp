@@ -44,6 +44,9 @@ class Stage {
 
     // Shows the result of the game or, with `goNextLevel`, of the level, until the player closes it.
     virtual Task<> showResult(bool goNextLevel) = 0;
+    // Asks the player for the name that a high score is entered with.
+    virtual Task<std::string> enterName() = 0;
+    virtual Task<> showHighScores(std::int16_t tableIndex) = 0;
     virtual void showMainMenu() = 0;
 };
 

@@ -13,9 +13,11 @@ std::string fillText(std::string_view text, std::initializer_list<TemplateArgume
         const std::string& key = (argument++)->text();
         if (argument != keysAndValues.end())
             value = (argument++)->text();
-        assert(!key.empty() && value.find(key) == std::string_view::npos);
-        for (auto at = filled.find(key); at != std::string::npos; at = filled.find(key))
+        assert(!key.empty());
+        for (auto at = filled.find(key); at != std::string::npos; at = filled.find(key)) {
+            assert(value.find(key) == std::string_view::npos);
             filled.replace(at, key.size(), value);
+        }
     }
     return filled;
 }

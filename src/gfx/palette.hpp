@@ -22,6 +22,7 @@ constexpr Colour valueColour{249, 249, 230};      // numbers in the panels
 constexpr Colour pauseTextColour{255, 255, 192};
 constexpr Colour pauseBackground{128, 128, 255};
 constexpr Brush backgroundBrush{backgroundColour};
+constexpr Brush viewBrush{backgroundColour};  // the view of the high scores
 constexpr Brush blackBrush{black};
 constexpr Pen lightPen{highlightColour};
 constexpr Pen outlinePen{{170, 170, 100}};  // the result dialog's button

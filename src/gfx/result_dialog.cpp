@@ -48,7 +48,6 @@ void ResultDialog::Form_Load() {
     fillBox(frameBox_);
     canvas().font = textFont;
     drawShadowText(statsBox_, 2, resultText(game_, goNextLevel), text_format::centre);
-    okBox_.hovered = false;
     drawOkButton();
 }
 

@@ -1,16 +1,20 @@
 #pragma once
 
+#include <cstdint>
 #include <functional>
 #include <string>
+#include <string_view>
 
 #include "base/task.hpp"
+#include "platform/input_event.hpp"
 #include "platform/surface.hpp"
 #include "platform/text.hpp"
 
 namespace quabble {
 
-// Something that lies on a window above its picture and takes the mouse there. It becomes visible, and goes,
-// when the window is presented; the picture beneath stays as it is.
+// Something that lies on a window above its picture and takes the mouse there and, while it has the focus,
+// the keyboard. It becomes visible, and goes, when the window is presented; the picture beneath stays as it
+// is.
 class Control {
  public:
     virtual ~Control() = default;
@@ -18,9 +22,23 @@ class Control {
     bool visible = false;
     Rect area;
 
-    virtual void paint(Surface& surface) const = 0;
-    virtual Task<> mouseDown() = 0;
+    virtual void paint(Surface& surface, bool hasFocus) const = 0;
+    virtual Task<> mouseDown(Point at, bool extends) = 0;
+    // The pointer moved, or the button was let go, after a press on the control.
+    virtual void mouseDrag(Point /*at*/) {}
+
+    virtual bool takesFocus() const { return false; }
+    virtual bool takesText() const { return false; }
+    // A key that the control with the focus may act on; false when it means nothing to it.
+    virtual bool takesKey(std::int16_t /*key*/) const { return false; }
+    virtual Task<> keyPress(std::int16_t key);
+    virtual void textInput(std::string_view /*utf8*/) {}
+    virtual void edit(EditCommand /*command*/, bool /*extends*/) {}
 };
+
+// Paints the edge of a control that takes the keyboard and, while it has the focus, a bright ring around it.
+void paintControlEdge(Surface& surface, const Rect& area, bool hasFocus);
+constexpr Colour controlInk{16, 22, 48};
 
 // A line of text in the middle of a plain area.
 class Label final : public Control {
@@ -31,13 +49,22 @@ class Label final : public Control {
     Colour background;
     std::function<Task<>()> onClick;
 
-    void paint(Surface& surface) const override {
-        surface.fill(area, background);
-        drawText(surface, area, caption,
-                 text_format::centre + text_format::verticalCentre + text_format::singleLine, textColour,
-                 font);
-    }
-    Task<> mouseDown() override { return onClick(); }
+    void paint(Surface& surface, bool hasFocus) const override;
+    Task<> mouseDown(Point, bool) override { return onClick(); }
+};
+
+// A button of the platform's own make. The space key presses it while it has the focus.
+class PushButton final : public Control {
+ public:
+    std::string caption;  // Windows-1252
+    Font font;
+    std::function<Task<>()> onClick;
+
+    void paint(Surface& surface, bool hasFocus) const override;
+    Task<> mouseDown(Point, bool) override { return onClick(); }
+    bool takesFocus() const override { return true; }
+    bool takesKey(std::int16_t key) const override { return key == keys::space; }
+    Task<> keyPress(std::int16_t) override { return onClick(); }
 };
 
 }  // namespace quabble

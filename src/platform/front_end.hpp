@@ -19,9 +19,10 @@ enum class WindowId : std::uint32_t { none = 0 };
 
 // What a native window is made from. It never changes its size.
 struct NativeWindow {
-    std::string caption;              // UTF-8
-    Size clientSize;                  // what the program paints
-    std::optional<Point> position;    // of its outer frame; without one, centred on its owner or the screen
+    std::string caption;            // UTF-8
+    Size clientSize;                // what the program paints
+    std::optional<Point> position;  // of its outer frame; without one, centred on its owner or the screen
+    bool borderless = false;
     WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner and centres on it
 };
 
@@ -50,6 +51,21 @@ class FrontEnd {
     // The icon of all windows that are made from now on.
     virtual void setIcon(const Icon& /*icon*/) {}
     virtual Size screenSize() { return {1024, 768}; }
+
+    // Shows a message with an OK button and waits for it.
+    virtual void showMessageBox(const std::string& title, const std::string& text) = 0;
+
+    // Opens a file or an address with whatever program the desktop has for it, in the given folder, and comes
+    // back at once. Nobody hears of it when that fails.
+    virtual void openDocument(const std::string& /*document*/, const std::string& /*folder*/) {}
+
+    // While a window has an area where text is typed, typed text comes as events, and what an input method
+    // shows lies at the area. Without one it does not.
+    virtual void setTextInput(WindowId /*window*/, std::optional<Rect> /*area*/) {}
+
+    // The text that the desktop's programs exchange, UTF-8.
+    virtual std::string clipboardText() { return {}; }
+    virtual void setClipboardText(const std::string& /*text*/) {}
 
     // The folder of the running program, without a separator at its end.
     virtual std::string executableFolder() = 0;

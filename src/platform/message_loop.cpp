@@ -18,12 +18,13 @@ Task<> MessageLoop::runPendingMessages() {
 
 Task<> MessageLoop::showModal(Window& window) {
     window.show();
-    modalWindows_.push_back(&window);
-    while (window.isShown()) {
-        co_await nextMessage();
-        co_await deliverOne();
+    {
+        const ModalWindow modal(*this, window);
+        while (window.isShown()) {
+            co_await nextMessage();
+            co_await deliverOne();
+        }
     }
-    std::erase(modalWindows_, &window);
     co_await pause(milliseconds::zero());
 }
 

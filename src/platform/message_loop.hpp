@@ -85,6 +85,20 @@ class MessageLoop {
         void await_resume() { suspended = false; }
     };
 
+    // A window takes all input as long as this lives.
+    class ModalWindow {
+     public:
+        ModalWindow(MessageLoop& loop, Window& window) : loop_(loop) {
+            loop_.modalWindows_.push_back(&window);
+        }
+        ~ModalWindow() { loop_.modalWindows_.pop_back(); }
+        ModalWindow(const ModalWindow&) = delete;
+        ModalWindow& operator=(const ModalWindow&) = delete;
+
+     private:
+        MessageLoop& loop_;
+    };
+
     bool isOver(std::optional<TimePoint> wait) const;
     bool hasMessage() const;
     Timer* firstDueTimer() const;

@@ -28,6 +28,8 @@ void Window::setClientSize(Size size) {
 void Window::show() {
     shown_ = true;
     state_ = State::Normal;
+    focus_ = nullptr;
+    pressed_ = nullptr;
     id_ = static_cast<WindowId>(++loop_.lastWindowId_);
     Form_Load();
     traits_.owner = owner_ == nullptr ? WindowId::none : owner_->id_;
@@ -44,6 +46,8 @@ void Window::unload() {
 }
 
 void Window::refresh() {
+    if (!shown_)
+        return;
     const bool covered =
         std::ranges::any_of(controls_, [](const Control* control) { return control->visible; });
     if (!covered) {
@@ -53,7 +57,7 @@ void Window::refresh() {
     composed_ = canvas_.picture;
     for (const Control* control : controls_) {
         if (control->visible)
-            control->paint(composed_);
+            control->paint(composed_, control == focus_);
     }
     loop_.frontEnd().showPixels(id_, composed_);
 }
@@ -72,20 +76,37 @@ Task<> Window::Form_KeyPress(std::int16_t) {
     co_return;
 }
 
+void Window::setFocus(Control* control) {
+    focus_ = control;
+    const bool takesText = control != nullptr && control->takesText();
+    loop_.frontEnd().setTextInput(id_, takesText ? std::optional(control->area) : std::nullopt);
+}
+
 Task<> Window::handle(InputEvent event) {
+    const Point at{static_cast<std::int32_t>(std::floor(event.x)),
+                   static_cast<std::int32_t>(std::floor(event.y))};
     switch (event.kind) {
         case EventKind::MouseDown:
-            if (Control* control = controlAt(event.x, event.y))
-                co_await control->mouseDown();
+            if (Control* control = controlAt(at))
+                co_await pressControl(*control, event);
             else
                 co_await Form_MouseDown(event.x, event.y);
             break;
         case EventKind::MouseMove:
-            if (controlAt(event.x, event.y) == nullptr)
+            if (pressed_ != nullptr)
+                dragControl(at);
+            else if (controlAt(at) == nullptr)
                 co_await Form_MouseMove(event.x, event.y);
             break;
+        case EventKind::MouseUp:
+            pressed_ = nullptr;
+            break;
         case EventKind::KeyPress:
-            co_await Form_KeyPress(event.key);
+            co_await pressKey(event.key);
+            break;
+        case EventKind::TextInput:
+        case EventKind::Edit:
+            editText(event);
             break;
         case EventKind::CloseButton:
             unload();
@@ -99,6 +120,56 @@ Task<> Window::handle(InputEvent event) {
     }
 }
 
+Task<> Window::pressControl(Control& control, InputEvent event) {
+    if (control.takesFocus()) {
+        pressed_ = &control;
+        setFocus(&control);
+    }
+    const Point at{static_cast<std::int32_t>(std::floor(event.x)),
+                   static_cast<std::int32_t>(std::floor(event.y))};
+    co_await control.mouseDown(at, event.extends);
+    refresh();
+}
+
+void Window::dragControl(Point at) {
+    pressed_->mouseDrag(at);
+    refresh();
+}
+
+Task<> Window::pressKey(std::int16_t key) {
+    if (focus_ != nullptr && key == keys::tab) {
+        focusNext();
+        refresh();
+    } else if (focus_ != nullptr && focus_->takesText() && key == keys::backspace) {
+        focus_->edit(EditCommand::Backspace, false);
+        refresh();
+    } else if (focus_ != nullptr && focus_->takesKey(key)) {
+        co_await focus_->keyPress(key);
+    } else {
+        co_await Form_KeyPress(key);
+    }
+}
+
+void Window::editText(const InputEvent& event) {
+    if (focus_ == nullptr)
+        return;
+    if (event.kind == EventKind::TextInput)
+        focus_->textInput(event.text);
+    else
+        focus_->edit(event.command, event.extends);
+    refresh();
+}
+
+void Window::focusNext() {
+    auto next = std::ranges::find(controls_, focus_);
+    do {
+        ++next;
+        if (next == controls_.end())
+            next = controls_.begin();
+    } while (!(*next)->takesFocus() || !(*next)->visible);
+    setFocus(*next);
+}
+
 void Window::changeState(State state) {
     if (state == state_)
         return;
@@ -106,11 +177,9 @@ void Window::changeState(State state) {
     Form_Resize();
 }
 
-Control* Window::controlAt(float x, float y) const {
-    const auto column = static_cast<std::int32_t>(std::floor(x));
-    const auto row = static_cast<std::int32_t>(std::floor(y));
+Control* Window::controlAt(Point at) const {
     const auto found = std::ranges::find_if(controls_ | std::views::reverse, [&](const Control* control) {
-        return control->visible && control->area.contains(column, row);
+        return control->visible && control->area.contains(at.x, at.y);
     });
     return found == controls_.rend() ? nullptr : *found;
 }

@@ -45,7 +45,7 @@ class Window {
     // Closes the window (Form_Unload). It can be shown again.
     void unload();
 
-    // Makes the picture, with the visible controls above it, what is seen of the window.
+    // Makes the picture, with the visible controls above it, what is seen of the window, if it is shown.
     void refresh();
 
     void minimise();
@@ -55,7 +55,10 @@ class Window {
     void setCaption(std::string caption) { traits_.caption = std::move(caption); }  // UTF-8
     void setClientSize(Size size);
     void setPosition(Point position) { traits_.position = position; }
+    void setBorderless() { traits_.borderless = true; }
     void addControl(Control& control) { controls_.push_back(&control); }
+    // The control that the keyboard goes to; null for the window itself.
+    void setFocus(Control* control);
 
     virtual void Form_Load() {}
     virtual void Form_Unload() {}
@@ -69,7 +72,12 @@ class Window {
     friend class MessageLoop;
     Task<> handle(InputEvent event);
     void changeState(State state);
-    Control* controlAt(float x, float y) const;
+    Control* controlAt(Point at) const;
+    Task<> pressControl(Control& control, InputEvent event);
+    Task<> pressKey(std::int16_t key);
+    void dragControl(Point at);
+    void editText(const InputEvent& event);
+    void focusNext();
 
     MessageLoop& loop_;
     Window* owner_;
@@ -78,6 +86,8 @@ class Window {
     Canvas canvas_;
     Surface composed_;
     std::vector<Control*> controls_;
+    Control* focus_ = nullptr;
+    Control* pressed_ = nullptr;  // the control on which the mouse button went down
     bool shown_ = false;
     State state_ = State::Normal;
 };

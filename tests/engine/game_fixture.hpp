@@ -77,6 +77,9 @@ class GameFixture : public ::testing::Test {
     }
     Task<> pushRow() { return pushRowOf(*this); }
 
+    // What follows the result when the score enters its table.
+    std::string named() const { return "name? scores:" + std::to_string(state.scoreTableIndex) + " "; }
+
     bool isAtMenu() const { return state.mainMenuActive && !state.isGameActive() && !state.boolProcessing; }
 
     GameState state;

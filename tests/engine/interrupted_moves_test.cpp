@@ -50,8 +50,9 @@ TEST_F(InterruptedMoves, EndGameActsOnceAfterThem) {
     for (const GameMode mode : {GameMode::Training, GameMode::Timed, GameMode::Strategy}) {
         for (const int chance : {1, 2}) {
             play(mode, rows);
-            EXPECT_TRUE(moveWith({endGame, endGame}, chance)
-                            .ends_with(lines(closed + " timer=off result:1,6,3,3 timer=off menu")));
+            EXPECT_TRUE(
+                moveWith({endGame, endGame}, chance)
+                    .ends_with(lines(closed + " timer=off result:1,6,3,3 " + named() + "timer=off menu")));
             EXPECT_TRUE(isAtMenu());
             play(mode, rows);
             moveWith({}, chance);
@@ -96,12 +97,13 @@ TEST_F(InterruptedMoves, GiveUpWhenTheStripEndsTheGame) {
     for (const GameMode mode : {GameMode::Timed, GameMode::Strategy}) {
         for (const int chance : {1, 2}) {
             play(mode, fullBoard());
-            EXPECT_TRUE(moveWith({clickStrip}, chance).ends_with("result:1,6,3,3\ntimer=off\nmenu\n"));
+            EXPECT_TRUE(moveWith({clickStrip}, chance)
+                            .ends_with(lines("result:1,6,3,3 " + named() + "timer=off menu")));
             EXPECT_TRUE(isAtMenu());
             play(mode, rows);
             skipToLastRowOf(10);
-            EXPECT_TRUE(
-                moveWith({clickStrip}, chance).ends_with("result:11,6,0,0\ntimer=off\nmenu\npresent\n"));
+            EXPECT_TRUE(moveWith({clickStrip}, chance)
+                            .ends_with(lines("result:11,6,0,0 " + named() + "timer=off menu present")));
             EXPECT_TRUE(isAtMenu());
         }
     }

@@ -29,11 +29,11 @@ TEST_F(Moves, EveryGameStartsClean) {
         {GameMode::Training, 60, 16, "clear classic-panel play-panel ", " present present"},
         {GameMode::Timed, 70, 4, "timer=on clear arcade-panel interval=250 timer=on play-panel ", strip},
         {GameMode::Strategy, 80, 4, "timer=on clear arcade-panel timer=off play-panel ", strip}};
-    for (const std::int16_t table : std::array<std::int16_t, 3>{1, 2, 3})
-        highScores.insertHighScore(table, 50 + 10 * table, "");
     for (int i = 0; i < 2; ++i) {
         for (const Case& c : cases) {
-            state.stats.bestScore = 0;
+            const auto table = static_cast<std::int16_t>(c.mode);
+            highScores = {};
+            highScores.insertHighScore(table, c.bestScore, "");
             start(c.mode);
             EXPECT_EQ(stage.takeLines(), lines(c.before + "board=" + fullRows(c.rows, '2') + c.after));
             EXPECT_EQ(show(state.nextRow), fullRows(1, '2'));
@@ -50,6 +50,8 @@ TEST_F(Moves, EveryGameStartsClean) {
             EXPECT_EQ(state.stats.bestScore, c.bestScore);
             run(game.endGame());
             EXPECT_TRUE(isAtMenu());
+            EXPECT_EQ(highScores.table(table).names[0], "Player");
+            EXPECT_EQ(highScores.table(table).scores[1], c.bestScore);
             stage.takeLines();
         }
     }
@@ -64,11 +66,12 @@ TEST_F(Moves, ClustersGoStepByStep) {
                 "board=....3/..2.3332 points=6@4,15 present messages pause=250 board=....3/...23332 present");
     expectClick("nothing left", GameMode::Training, ".....11", {7, 16},
                 "score=3 board= points=3@7,16 present pause=250 messages board= points=3@7,16 present board= "
-                "present timer=off result:1,3,2,2 timer=off menu");
+                "present timer=off result:1,3,2,2 name? scores:1 timer=off menu");
     expectClick(
         "a single block left", GameMode::Training, ".....112", {6, 16},
         "score=3 board=.......2 points=3@6,16 present pause=250 messages board=.......2 points=3@6,16 "
-        "present messages pause=250 board=.....2 present timer=off result:1,3,2,2 timer=off menu");
+        "present messages pause=250 board=.....2 present timer=off result:1,3,2,2 name? scores:1 timer=off "
+        "menu");
     expectClick("nothing to close", GameMode::Timed, "....31/....11/221222332211", {6, 14},
                 "board=....3//221222332211 score=6 points=6@6,14 present pause=125 messages "
                 "board=....3/221222332211 present");

@@ -29,6 +29,8 @@ class QuietStage : public Stage {
     void switchBlockTimer(bool) override {}
     void setBlockTimerInterval(std::chrono::milliseconds) override {}
     Task<> showResult(bool) override { co_return; }
+    Task<std::string> enterName() override { co_return "Player"; }
+    Task<> showHighScores(std::int16_t) override { co_return; }
     void showMainMenu() override { state_.mainMenuActive = true; }
 
  protected:

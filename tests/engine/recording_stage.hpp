@@ -68,6 +68,15 @@ class RecordingStage final : public Stage {
               ",", stats.largestCluster);
         co_await act(inDialogs);
     }
+    Task<std::string> enterName() override {
+        write("name?");
+        co_await act(inDialogs);
+        co_return "Player";
+    }
+    Task<> showHighScores(std::int16_t tableIndex) override {
+        write("scores:", tableIndex);
+        co_await act(inDialogs);
+    }
     void showMainMenu() override {
         write("menu");
         state_.mainMenuActive = true;

@@ -20,12 +20,12 @@ void HeadlessFrontEnd::closeWindow(WindowId window) {
 
 void HeadlessFrontEnd::minimiseWindow(WindowId window) {
     windows_.at(window).minimised = true;
-    loop_->post({window, EventKind::Minimised});
+    loop_->post({.window = window, .kind = EventKind::Minimised});
 }
 
 void HeadlessFrontEnd::restoreWindow(WindowId window) {
     windows_.at(window).minimised = false;
-    loop_->post({window, EventKind::Restored});
+    loop_->post({.window = window, .kind = EventKind::Restored});
 }
 
 }  // namespace quabble

@@ -2,6 +2,8 @@
 
 #include <map>
 #include <string>
+#include <utility>
+#include <vector>
 
 #include "platform/front_end.hpp"
 #include "platform/message_loop.hpp"
@@ -28,7 +30,19 @@ class HeadlessFrontEnd final : public FrontEnd {
     void showPixels(WindowId window, const Surface& picture) override;
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
+    void showMessageBox(const std::string& title, const std::string& text) override {
+        messages.push_back(title + ": " + text);
+    }
+    void openDocument(const std::string& document, const std::string& folder) override {
+        openedDocuments.push_back(document + " in " + folder);
+    }
+    std::string clipboardText() override { return clipboard; }
+    void setClipboardText(const std::string& text) override { clipboard = text; }
     std::string executableFolder() override { return executableFolder_; }
+
+    std::vector<std::string> messages;         // "title: text" of each message box
+    std::vector<std::string> openedDocuments;  // "document in folder"
+    std::string clipboard;                     // UTF-8
 
     void advanceTo(TimePoint time) { now_ = std::max(now_, time); }
     void restoreWindow(WindowId window);

@@ -1,9 +1,21 @@
 #include "platform/headless/scripted_user.hpp"
 
+#include <cassert>
+
 namespace quabble {
 
 void ScriptedUser::press(std::int16_t key) {
-    loop_.post({topWindow(), EventKind::KeyPress, 0, 0, key});
+    loop_.post({.window = topWindow(), .kind = EventKind::KeyPress, .key = key});
+    loop_.wake();
+}
+
+void ScriptedUser::type(const std::string& utf8) {
+    loop_.post({.window = topWindow(), .kind = EventKind::TextInput, .text = utf8});
+    loop_.wake();
+}
+
+void ScriptedUser::edit(EditCommand command, bool extends) {
+    loop_.post({.window = topWindow(), .kind = EventKind::Edit, .command = command, .extends = extends});
     loop_.wake();
 }
 
@@ -17,8 +29,13 @@ void ScriptedUser::wait(milliseconds duration) {
     loop_.wake();
 }
 
+const std::pair<const WindowId, HeadlessFrontEnd::Shown>& ScriptedUser::topmost() const {
+    assert(!frontEnd_.windows().empty());
+    return *frontEnd_.windows().rbegin();
+}
+
 void ScriptedUser::act(EventKind kind, float x, float y) {
-    loop_.post({topWindow(), kind, x, y});
+    loop_.post({.window = topWindow(), .kind = kind, .x = x, .y = y});
     loop_.wake();
 }
 

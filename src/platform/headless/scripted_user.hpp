@@ -1,6 +1,8 @@
 #pragma once
 
 #include <cstdint>
+#include <string>
+#include <utility>
 
 #include "platform/headless/headless_front_end.hpp"
 #include "platform/message_loop.hpp"
@@ -16,6 +18,8 @@ class ScriptedUser {
     void click(float x, float y) { act(EventKind::MouseDown, x, y); }
     void movePointer(float x, float y) { act(EventKind::MouseMove, x, y); }
     void press(std::int16_t key);
+    void type(const std::string& utf8);
+    void edit(EditCommand command, bool extends = false);
     void clickCloseButton() { act(EventKind::CloseButton); }
     void minimise() { frontEnd_.minimiseWindow(topWindow()), loop_.wake(); }
     void restore() { frontEnd_.restoreWindow(topWindow()), loop_.wake(); }
@@ -23,12 +27,13 @@ class ScriptedUser {
     // Lets time pass; everything that falls due meanwhile happens at its own moment.
     void wait(milliseconds duration);
 
-    // The window that was opened last.
-    WindowId topWindow() const { return frontEnd_.windows().rbegin()->first; }
-    const HeadlessFrontEnd::Shown& top() const { return frontEnd_.windows().rbegin()->second; }
+    // The window that was opened last; there must be one.
+    WindowId topWindow() const { return topmost().first; }
+    const HeadlessFrontEnd::Shown& top() const { return topmost().second; }
     Colour pixel(std::int32_t x, std::int32_t y) const { return top().picture.at(x, y); }
 
  private:
+    const std::pair<const WindowId, HeadlessFrontEnd::Shown>& topmost() const;
     void act(EventKind kind, float x = 0, float y = 0);
 
     HeadlessFrontEnd& frontEnd_;

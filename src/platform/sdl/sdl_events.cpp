@@ -1,5 +1,7 @@
 #include "platform/sdl/sdl_events.hpp"
 
+#include <SDL2/SDL_keyboard.h>
+
 #include <limits>
 
 namespace quabble {
@@ -24,6 +26,53 @@ std::optional<std::int16_t> characterOf(const SDL_Keysym& keysym) {
     return static_cast<std::int16_t>(hasCharacter ? keysym.sym : ' ');
 }
 
+// What a key asks of a text being edited, with Ctrl held or not.
+std::optional<EditCommand> commandOf(const SDL_Keysym& keysym) {
+    const bool ctrl = (keysym.mod & KMOD_CTRL) != 0;
+    switch (keysym.sym) {
+        case SDLK_LEFT:
+            return ctrl ? EditCommand::WordLeft : EditCommand::Left;
+        case SDLK_RIGHT:
+            return ctrl ? EditCommand::WordRight : EditCommand::Right;
+        case SDLK_HOME:
+            return EditCommand::Home;
+        case SDLK_END:
+            return EditCommand::End;
+        case SDLK_DELETE:
+            return EditCommand::Delete;
+        case SDLK_a:
+            return ctrl ? std::optional(EditCommand::SelectAll) : std::nullopt;
+        case SDLK_c:
+            return ctrl ? std::optional(EditCommand::Copy) : std::nullopt;
+        case SDLK_x:
+            return ctrl ? std::optional(EditCommand::Cut) : std::nullopt;
+        case SDLK_v:
+            return ctrl ? std::optional(EditCommand::Paste) : std::nullopt;
+        default:
+            return std::nullopt;
+    }
+}
+
+// A key that is held down is one press; only what it does to a text is repeated.
+std::optional<InputEvent> translateKey(const SDL_KeyboardEvent& event) {
+    const bool extends = (event.keysym.mod & KMOD_SHIFT) != 0;
+    if (const auto command = commandOf(event.keysym))
+        return InputEvent{.kind = EventKind::Edit, .command = *command, .extends = extends};
+    const auto key = characterOf(event.keysym);
+    if (key && event.repeat == 0)
+        return InputEvent{.kind = EventKind::KeyPress, .key = *key};
+    if (key == keys::backspace)
+        return InputEvent{.kind = EventKind::Edit, .command = EditCommand::Backspace};
+    return std::nullopt;
+}
+
+InputEvent mouseEvent(EventKind kind, std::int32_t x, std::int32_t y) {
+    return {.kind = kind,
+            .x = static_cast<float>(x),
+            .y = static_cast<float>(y),
+            .extends = (SDL_GetModState() & KMOD_SHIFT) != 0};
+}
+
 std::optional<InputEvent> translateWindowEvent(const SDL_WindowEvent& event) {
     switch (event.event) {
         case SDL_WINDOWEVENT_CLOSE:
@@ -42,18 +91,15 @@ std::optional<InputEvent> translateWindowEvent(const SDL_WindowEvent& event) {
 std::optional<InputEvent> translate(const SDL_Event& event) {
     switch (event.type) {
         case SDL_MOUSEBUTTONDOWN:
-            return InputEvent{.kind = EventKind::MouseDown,
-                              .x = static_cast<float>(event.button.x),
-                              .y = static_cast<float>(event.button.y)};
+            return mouseEvent(EventKind::MouseDown, event.button.x, event.button.y);
+        case SDL_MOUSEBUTTONUP:
+            return mouseEvent(EventKind::MouseUp, event.button.x, event.button.y);
         case SDL_MOUSEMOTION:
-            return InputEvent{.kind = EventKind::MouseMove,
-                              .x = static_cast<float>(event.motion.x),
-                              .y = static_cast<float>(event.motion.y)};
+            return mouseEvent(EventKind::MouseMove, event.motion.x, event.motion.y);
         case SDL_KEYDOWN:
-            // A key that is held down is one press.
-            if (const auto key = characterOf(event.key.keysym); key && event.key.repeat == 0)
-                return InputEvent{.kind = EventKind::KeyPress, .key = *key};
-            return std::nullopt;
+            return translateKey(event.key);
+        case SDL_TEXTINPUT:
+            return InputEvent{.kind = EventKind::TextInput, .text = event.text.text};
         case SDL_WINDOWEVENT:
             return translateWindowEvent(event.window);
         default:
@@ -64,11 +110,14 @@ std::optional<InputEvent> translate(const SDL_Event& event) {
 std::uint32_t windowOf(const SDL_Event& event) {
     switch (event.type) {
         case SDL_MOUSEBUTTONDOWN:
+        case SDL_MOUSEBUTTONUP:
             return event.button.windowID;
         case SDL_MOUSEMOTION:
             return event.motion.windowID;
         case SDL_KEYDOWN:
             return event.key.windowID;
+        case SDL_TEXTINPUT:
+            return event.text.windowID;
         case SDL_WINDOWEVENT:
             return event.window.windowID;
         default:

@@ -7,6 +7,7 @@
 #include <cstring>
 #include <filesystem>
 
+#include "platform/sdl/detached_process.hpp"
 #include "platform/sdl/sdl_events.hpp"
 
 namespace quabble {
@@ -25,7 +26,8 @@ class SdlFrontEnd::DesktopWindow {
     DesktopWindow(const NativeWindow& traits, Point position, const DesktopWindow* owner) {
         const bool isDialog = owner != nullptr;
         SDL_SetHint(SDL_HINT_X11_WINDOW_TYPE, isDialog ? "_NET_WM_WINDOW_TYPE_DIALOG" : "");
-        const Uint32 flags = SDL_WINDOW_HIDDEN | (isDialog ? Uint32{SDL_WINDOW_SKIP_TASKBAR} : 0U);
+        const Uint32 flags = SDL_WINDOW_HIDDEN | (isDialog ? Uint32{SDL_WINDOW_SKIP_TASKBAR} : 0U) |
+                             (traits.borderless ? Uint32{SDL_WINDOW_BORDERLESS} : 0U);
         window_.reset(SDL_CreateWindow(traits.caption.c_str(), position.x, position.y,
                                        traits.clientSize.width, traits.clientSize.height, flags));
         if (isDialog && window_)
@@ -97,6 +99,7 @@ std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
         return nullptr;
     }
     SDL_EnableScreenSaver();
+    SDL_StopTextInput();
     std::signal(SIGHUP, passOnHangUp);
     return std::unique_ptr<SdlFrontEnd>(new SdlFrontEnd);
 }
@@ -184,6 +187,35 @@ void SdlFrontEnd::setIcon(const Icon& icon) {
         SDL_CreateRGBSurfaceWithFormatFrom(const_cast<unsigned char*>(icon.rgba.data()), icon.size.width,
                                            icon.size.height, 32, icon.size.width * 4, SDL_PIXELFORMAT_RGBA32);
     icon_.reset(borrowed);
+}
+
+void SdlFrontEnd::showMessageBox(const std::string& title, const std::string& text) {
+    SDL_ShowSimpleMessageBox(SDL_MESSAGEBOX_ERROR, title.c_str(), text.c_str(), nullptr);
+}
+
+void SdlFrontEnd::openDocument(const std::string& document, const std::string& folder) {
+    startDetached({"xdg-open", document}, folder);
+}
+
+void SdlFrontEnd::setTextInput(WindowId, std::optional<Rect> area) {
+    if (!area) {
+        SDL_StopTextInput();
+        return;
+    }
+    SDL_Rect place{area->left, area->top, area->width(), area->height()};
+    SDL_SetTextInputRect(&place);
+    SDL_StartTextInput();
+}
+
+std::string SdlFrontEnd::clipboardText() {
+    char* text = SDL_GetClipboardText();
+    std::string copy = text == nullptr ? "" : text;
+    SDL_free(text);
+    return copy;
+}
+
+void SdlFrontEnd::setClipboardText(const std::string& text) {
+    SDL_SetClipboardText(text.c_str());
 }
 
 void SdlFrontEnd::FreeSurface::operator()(SDL_Surface* surface) const {

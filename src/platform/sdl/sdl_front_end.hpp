@@ -27,6 +27,11 @@ class SdlFrontEnd final : public FrontEnd {
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
     void setIcon(const Icon& icon) override;
+    void showMessageBox(const std::string& title, const std::string& text) override;
+    void openDocument(const std::string& document, const std::string& folder) override;
+    void setTextInput(WindowId window, std::optional<Rect> area) override;
+    std::string clipboardText() override;
+    void setClipboardText(const std::string& text) override;
     Size screenSize() override;
     std::string executableFolder() override;
 

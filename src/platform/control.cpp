@@ -1,0 +1,38 @@
+#include "platform/control.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr std::int32_t centredLine =
+    text_format::centre + text_format::verticalCentre + text_format::singleLine;
+
+constexpr Colour buttonFace{226, 230, 240};
+constexpr Colour edge{28, 38, 78};
+constexpr Colour focusRing{249, 249, 230};
+
+}  // namespace
+
+Task<> Control::keyPress(std::int16_t) {
+    co_return;
+}
+
+void paintControlEdge(Surface& surface, const Rect& area, bool hasFocus) {
+    surface.outline(area, edge);
+    if (!hasFocus)
+        return;
+    surface.outline(area.shrunkBy(-1), focusRing);
+    surface.outline(area.shrunkBy(-2), focusRing);
+}
+
+void Label::paint(Surface& surface, bool) const {
+    surface.fill(area, background);
+    drawText(surface, area, caption, centredLine, textColour, font);
+}
+
+void PushButton::paint(Surface& surface, bool hasFocus) const {
+    surface.fill(area, buttonFace);
+    paintControlEdge(surface, area, hasFocus);
+    drawText(surface, area, caption, centredLine, controlInk, font);
+}
+
+}  // namespace quabble

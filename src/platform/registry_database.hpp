@@ -1,0 +1,61 @@
+#pragma once
+
+#include <sqlite3.h>
+
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <string_view>
+
+namespace quabble {
+
+// A prepared statement. Texts and bytes bound to it must outlive its steps.
+class RegistryStatement {
+ public:
+    RegistryStatement(sqlite3* connection, std::string_view sql);
+
+    RegistryStatement& bind(int index, std::string_view text);
+    RegistryStatement& bind(int index, std::int64_t number);
+    RegistryStatement& bindBytes(int index, const void* bytes, std::size_t size);
+
+    bool nextRow() { return statement_ && sqlite3_step(statement_.get()) == SQLITE_ROW; }
+    bool run() { return statement_ && sqlite3_step(statement_.get()) == SQLITE_DONE; }
+    std::int64_t number(int column) const { return sqlite3_column_int64(statement_.get(), column); }
+    std::string_view bytes(int column) const;
+
+ private:
+    struct Finalise {
+        void operator()(sqlite3_stmt* statement) const { sqlite3_finalize(statement); }
+    };
+    std::unique_ptr<sqlite3_stmt, Finalise> statement_;
+};
+
+// A connection to the registry's database. Destroying it commits the transaction that was begun.
+class RegistryDatabase {
+ public:
+    // Opens the file (an SQLite URI or a path), begins a transaction and makes sure that it is a registry;
+    // nothing when any of it fails.
+    static std::unique_ptr<RegistryDatabase> open(const std::string& path);
+    // A connection alone, without a transaction; it keeps a database in memory alive.
+    static std::unique_ptr<RegistryDatabase> connect(const std::string& path);
+    ~RegistryDatabase();
+    RegistryDatabase(const RegistryDatabase&) = delete;
+    RegistryDatabase& operator=(const RegistryDatabase&) = delete;
+
+    RegistryStatement prepare(std::string_view sql) { return {connection_.get(), sql}; }
+
+ private:
+    struct Close {
+        void operator()(sqlite3* connection) const { sqlite3_close(connection); }
+    };
+    explicit RegistryDatabase(sqlite3* connection) : connection_(connection) {}
+    bool execute(const char* sql);
+    bool begin();
+    bool isOrBecomesRegistry();
+
+    std::unique_ptr<sqlite3, Close> connection_;
+    bool inTransaction_ = false;
+};
+
+}  // namespace quabble

@@ -1,0 +1,175 @@
+#include "platform/text_box.hpp"
+
+#include <algorithm>
+
+#include "platform/windows_1252.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr Colour paper{249, 250, 255};
+constexpr Colour selected{62, 105, 214};
+
+}  // namespace
+
+void TextBox::setText(std::string text) {
+    text_ = std::move(text);
+    caret_ = anchor_ = text_.size();
+    scrollToCaret();
+}
+
+void TextBox::paint(Surface& surface, bool hasFocus) const {
+    surface.fill(area, paper);
+    paintControlEdge(surface, area, hasFocus);
+    // The line is drawn on a picture of its own, which cuts off what lies outside the box.
+    const Rect window = inner();
+    Surface line(window.width(), window.height());
+    line.fill(line.bounds(), paper);
+    const Rect place{-scroll_, 0, widthUpTo(text_.size()) - scroll_ + 1, window.height()};
+    constexpr std::int32_t format = text_format::verticalCentre + text_format::singleLine;
+    drawText(line, place, text_, format, controlInk, font);
+    const auto [first, last] = std::minmax(caret_, anchor_);
+    if (first != last) {
+        const Rect marked{widthUpTo(first) - scroll_, 0, widthUpTo(last) - scroll_, window.height()};
+        Surface highlighted(line.width(), line.height());
+        highlighted.fill(highlighted.bounds(), selected);
+        drawText(highlighted, place, text_, format, paper, font);
+        line.copy(marked, highlighted, {marked.left, 0});
+    }
+    if (hasFocus) {
+        const std::int32_t x = widthUpTo(caret_) - scroll_;
+        line.fill({x, 1, x + 1, window.height() - 1}, controlInk);
+    }
+    surface.copy(window, line, {0, 0});
+}
+
+Task<> TextBox::mouseDown(Point at, bool extends) {
+    moveCaret(characterAt(at), extends);
+    co_return;
+}
+
+void TextBox::mouseDrag(Point at) {
+    moveCaret(characterAt(at), true);
+}
+
+void TextBox::textInput(std::string_view utf8) {
+    replaceSelection(windows1252Of(utf8));
+}
+
+void TextBox::edit(EditCommand command, bool extends) {
+    const bool hasSelection = caret_ != anchor_;
+    switch (command) {
+        case EditCommand::Left:
+            if (hasSelection && !extends)
+                moveCaret(std::min(caret_, anchor_), false);
+            else
+                moveCaret(caret_ == 0 ? 0 : caret_ - 1, extends);
+            break;
+        case EditCommand::Right:
+            if (hasSelection && !extends)
+                moveCaret(std::max(caret_, anchor_), false);
+            else
+                moveCaret(std::min(caret_ + 1, text_.size()), extends);
+            break;
+        case EditCommand::WordLeft:
+            moveCaret(wordLeft(), extends);
+            break;
+        case EditCommand::WordRight:
+            moveCaret(wordRight(), extends);
+            break;
+        case EditCommand::Home:
+            moveCaret(0, extends);
+            break;
+        case EditCommand::End:
+            moveCaret(text_.size(), extends);
+            break;
+        case EditCommand::Backspace:
+            if (!hasSelection && caret_ > 0)
+                anchor_ = caret_ - 1;
+            replaceSelection({});
+            break;
+        case EditCommand::Delete:
+            if (!hasSelection && caret_ < text_.size())
+                anchor_ = caret_ + 1;
+            replaceSelection({});
+            break;
+        case EditCommand::SelectAll:
+            anchor_ = 0;
+            moveCaret(text_.size(), true);
+            break;
+        case EditCommand::Copy:
+            copySelection();
+            break;
+        case EditCommand::Cut:
+            copySelection();
+            replaceSelection({});
+            break;
+        case EditCommand::Paste:
+            replaceSelection(windows1252Of(frontEnd_.clipboardText()));
+            break;
+    }
+}
+
+std::int32_t TextBox::widthUpTo(std::size_t characters) const {
+    return measureText(std::string_view(text_).substr(0, characters), font).width;
+}
+
+// The gap between characters nearest to a point.
+std::size_t TextBox::characterAt(Point at) const {
+    const std::int32_t x = at.x - inner().left + scroll_;
+    std::size_t character = 0;
+    while (character < text_.size() && (widthUpTo(character) + widthUpTo(character + 1)) / 2 < x)
+        ++character;
+    return character;
+}
+
+std::size_t TextBox::wordLeft() const {
+    std::size_t at = caret_;
+    while (at > 0 && text_[at - 1] == ' ')
+        --at;
+    while (at > 0 && text_[at - 1] != ' ')
+        --at;
+    return at;
+}
+
+std::size_t TextBox::wordRight() const {
+    std::size_t at = caret_;
+    while (at < text_.size() && text_[at] != ' ')
+        ++at;
+    while (at < text_.size() && text_[at] == ' ')
+        ++at;
+    return at;
+}
+
+std::string TextBox::selection() const {
+    const auto [first, last] = std::minmax(caret_, anchor_);
+    return text_.substr(first, last - first);
+}
+
+void TextBox::replaceSelection(std::string_view with) {
+    const auto [first, last] = std::minmax(caret_, anchor_);
+    text_.replace(first, last - first, with);
+    moveCaret(first + with.size(), false);
+}
+
+void TextBox::moveCaret(std::size_t to, bool extends) {
+    caret_ = to;
+    if (!extends)
+        anchor_ = to;
+    scrollToCaret();
+}
+
+void TextBox::copySelection() {
+    if (caret_ != anchor_)
+        frontEnd_.setClipboardText(utf8Of(selection()));
+}
+
+void TextBox::scrollToCaret() {
+    const std::int32_t caretX = widthUpTo(caret_);
+    const std::int32_t width = inner().width() - 1;
+    const std::int32_t furthest = std::max(0, widthUpTo(text_.size()) - width);
+    scroll_ = std::clamp(scroll_, std::max(0, caretX - width), std::max(caretX, 0));
+    scroll_ = std::min(scroll_, std::max(furthest, caretX - width));
+}
+
+}  // namespace quabble

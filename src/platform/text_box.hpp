@@ -1,0 +1,56 @@
+#pragma once
+
+#include <functional>
+#include <string>
+
+#include "platform/control.hpp"
+#include "platform/front_end.hpp"
+
+namespace quabble {
+
+// A box in which one line of text is edited, with a caret, a selection and the desktop's clipboard. The text
+// is Windows-1252; what is typed or pasted and the code page lacks becomes "?" at once. A line longer than
+// the box scrolls so that the caret is in sight.
+class TextBox final : public Control {
+ public:
+    // The front end, which must outlive the box, has the clipboard.
+    explicit TextBox(FrontEnd& frontEnd) : frontEnd_(frontEnd) {}
+
+    Font font;
+
+    const std::string& text() const { return text_; }
+    // Replaces the text; the caret is then at its end.
+    void setText(std::string text);
+
+    // The caret's place and the other end of the selection, in characters from the start.
+    std::size_t caret() const { return caret_; }
+    std::size_t anchor() const { return anchor_; }
+
+    void paint(Surface& surface, bool hasFocus) const override;
+    Task<> mouseDown(Point at, bool extends) override;
+    void mouseDrag(Point at) override;
+    bool takesFocus() const override { return true; }
+    bool takesText() const override { return true; }
+    void textInput(std::string_view utf8) override;
+    void edit(EditCommand command, bool extends) override;
+
+ private:
+    Rect inner() const { return area.shrunkBy(4); }
+    std::int32_t widthUpTo(std::size_t characters) const;
+    std::size_t characterAt(Point at) const;
+    std::size_t wordLeft() const;
+    std::size_t wordRight() const;
+    std::string selection() const;
+    void replaceSelection(std::string_view with);
+    void moveCaret(std::size_t to, bool extends);
+    void copySelection();
+    void scrollToCaret();
+
+    FrontEnd& frontEnd_;
+    std::string text_;
+    std::size_t caret_ = 0;
+    std::size_t anchor_ = 0;
+    std::int32_t scroll_ = 0;  // pixels of the line that lie left of the box
+};
+
+}  // namespace quabble

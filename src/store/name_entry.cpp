@@ -1,0 +1,73 @@
+#include "store/name_entry.hpp"
+
+#include <utility>
+
+#include "gfx/painters.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr std::size_t longestName = 19;
+constexpr Size dialogSize{360, 206};
+constexpr std::int32_t margin = 30;
+constexpr Font messageFont{Typeface::SansBold, 12};
+constexpr Font font{Typeface::Sans, 11};
+constexpr const char* congratulation = " Congratulations ! \r\n Your Score is among High scores ";
+
+}  // namespace
+
+std::string acceptedName(std::string typed) {
+    if (typed.empty())
+        return "-";
+    return typed.substr(0, longestName);
+}
+
+NameEntry::NameEntry(MessageLoop& loop, Window& owner) : Window(loop, &owner), txtName_(loop.frontEnd()) {
+    txtName_.font = font;
+    txtName_.area = Rect::ofSize(margin, 108, dialogSize.width - 2 * margin, 28);
+    txtName_.visible = true;
+    OKButton_.caption = "OK";
+    OKButton_.font = font;
+    OKButton_.area = Rect::ofSize((dialogSize.width - 90) / 2, 156, 90, 30);
+    OKButton_.visible = true;
+    OKButton_.onClick = [this] { return OKButton_Click(); };
+    addControl(txtName_);
+    addControl(OKButton_);
+}
+
+void NameEntry::Form_Load() {
+    setCaption("Best Score");
+    setClientSize(dialogSize);
+    canvas().picture.fill(canvas().picture.bounds(), palette::backgroundColour);
+    const auto label = [this](std::int32_t top, std::int32_t height, Colour colour) {
+        return ScreenButton{.surface = &canvas(),
+                            .left = margin,
+                            .top = top,
+                            .width = dialogSize.width - 2 * margin,
+                            .height = height,
+                            .textColour = colour};
+    };
+    canvas().font = messageFont;
+    drawShadowText(label(22, 44, palette::valueColour), 1, congratulation, text_format::centre);
+    canvas().font = font;
+    drawShadowText(label(84, 22, palette::highlightColour), 1, "Enter Your Name", defaultTextFormat);
+    txtName_.setText({});
+    setFocus(&txtName_);
+}
+
+void NameEntry::Form_Unload() {
+    nameEntered_ = acceptedName(txtName_.text());
+}
+
+Task<> NameEntry::Form_KeyPress(std::int16_t key) {
+    if (key == keys::enter || key == keys::escape)
+        unload();
+    co_return;
+}
+
+Task<> NameEntry::OKButton_Click() {
+    unload();
+    co_return;
+}
+
+}  // namespace quabble

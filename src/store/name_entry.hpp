@@ -1,0 +1,33 @@
+#pragma once
+
+#include <string>
+
+#include "gfx/screen_button.hpp"
+#include "platform/text_box.hpp"
+#include "platform/window.hpp"
+
+namespace quabble {
+
+// The name that goes into a table for what was typed: at most 19 characters, and "-" for none at all.
+std::string acceptedName(std::string typed);
+
+// The dialog that asks the player of a high score for a name. However it is closed, the name is what then
+// stands in its box.
+class NameEntry final : public Window {
+ public:
+    NameEntry(MessageLoop& loop, Window& owner);
+
+    const std::string& nameEntered() const { return nameEntered_; }
+
+ private:
+    void Form_Load() override;
+    void Form_Unload() override;
+    Task<> Form_KeyPress(std::int16_t key) override;
+    Task<> OKButton_Click();
+
+    TextBox txtName_;
+    PushButton OKButton_;
+    std::string nameEntered_;
+};
+
+}  // namespace quabble

@@ -1,0 +1,126 @@
+#include "store/score_view.hpp"
+
+#include <string>
+
+#include "base/round_half_even.hpp"
+#include "gfx/painters.hpp"
+#include "gfx/string_table.hpp"
+#include "store/version.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr Size viewSize{473, 473};
+constexpr Font font{Typeface::SerifBold, 14.25};
+constexpr const char* clearedName = "Anonoymous";
+
+}  // namespace
+
+ScoreView::ScoreView(MessageLoop& loop, Window& owner, HighScores& highScores, std::int16_t layoutUnit)
+    : Window(loop, &owner), highScores_(highScores), unit_(layoutUnit) {}
+
+void ScoreView::Form_Load() {
+    setCaption("Best Scores - " + std::string(applicationTitle));
+    setClientSize(viewSize);
+    canvas().font = font;
+    layOut();
+    fillBox(background_);
+    for (std::size_t place = 0; place < highScorePlaces; ++place)
+        drawRow(place);
+    drawTitle();
+    for (std::size_t i = 0; i < buttons_.size(); ++i)
+        drawButton(i, false);
+}
+
+void ScoreView::layOut() {
+    const auto [width, height] = outerSize();
+    background_ = {.surface = &canvas(), .width = width, .height = height, .fillBrush = palette::viewBrush};
+    title_ = {.surface = &canvas(),
+              .left = roundHalfEven(width / 2.0 - 2 * unit_),
+              .top = roundHalfEven(unit_ / 2.0),
+              .width = 4 * unit_,
+              .height = 20,
+              .fillBrush = palette::viewBrush,
+              .textColour = palette::labelColour};
+    buttons_ = {layOutButton(2), layOutButton(6)};
+}
+
+ScreenButton ScoreView::layOutButton(std::int32_t leftUnits) {
+    return {.surface = &canvas(),
+            .left = leftUnits * unit_,
+            .top = 9 * unit_,
+            .width = 3 * unit_,
+            .height = 30,
+            .fillBrush = palette::backgroundBrush,
+            .framePen = palette::lightPen,
+            .textColour = palette::panelTextColour};
+}
+
+void ScoreView::drawTitle() {
+    const auto title = static_cast<std::uint16_t>(string_ids::mainMenuBase + modeNum);
+    drawLabelledBox(title_, BoxStyle::Plain, false, 2, loadString(title));
+}
+
+void ScoreView::drawRow(std::size_t place) {
+    const HighScoreTable& table = highScores_.table(modeNum);
+    ScreenButton box{.surface = &canvas(),
+                     .left = unit_,
+                     .top = unit_ * static_cast<std::int32_t>(place + 1),
+                     .width = 6 * unit_,
+                     .height = unit_,
+                     .fillBrush = palette::viewBrush,
+                     .textColour = palette::highlightColour};
+    drawShadowText(box, 1, table.names[place], defaultTextFormat);
+    box.left = 8 * unit_;
+    box.width = 2 * unit_;
+    drawShadowText(box, 1, std::to_string(table.scores[place]), defaultTextFormat);
+}
+
+void ScoreView::drawButton(std::size_t i, bool highlighted) {
+    const auto caption = static_cast<std::uint16_t>(string_ids::ok + i);
+    drawLabelledBox(buttons_[i], highlighted ? BoxStyle::Framed : BoxStyle::Plain, highlighted,
+                    highlighted ? 6 : 4, loadString(caption));
+}
+
+Task<> ScoreView::Form_MouseMove(float x, float y) {
+    for (std::size_t i = 0; i < buttons_.size(); ++i) {
+        const bool over = hitTest(buttons_[i], x, y);
+        if (over == buttons_[i].hovered)
+            continue;
+        drawButton(i, over);
+        buttons_[i].hovered = over;
+        refresh();
+    }
+    co_return;
+}
+
+Task<> ScoreView::Form_MouseDown(float x, float y) {
+    if (hitTest(buttons_[0], x, y))
+        closeStats();
+    else if (hitTest(buttons_[1], x, y))
+        clearScores();
+    co_return;
+}
+
+Task<> ScoreView::Form_KeyPress(std::int16_t key) {
+    if (key == keys::enter || key == keys::escape)
+        closeStats();
+    co_return;
+}
+
+// There is no question first. Which button is hovered stays as it was, though both are drawn at rest.
+void ScoreView::clearScores() {
+    fillBox(background_);
+    drawTitle();
+    HighScoreTable& table = highScores_.table(modeNum);
+    for (std::size_t place = 0; place < highScorePlaces; ++place) {
+        table.names[place] = clearedName;
+        table.scores[place] = 0;
+        drawRow(place);
+    }
+    for (std::size_t i = 0; i < buttons_.size(); ++i)
+        drawButton(i, false);
+    refresh();
+}
+
+}  // namespace quabble

@@ -1,0 +1,41 @@
+#pragma once
+
+#include <array>
+#include <cstdint>
+
+#include "engine/high_scores.hpp"
+#include "gfx/screen_button.hpp"
+#include "platform/window.hpp"
+
+namespace quabble {
+
+// The view of one table of high scores, which can also clear it.
+class ScoreView final : public Window {
+ public:
+    // The loop, the owner and the tables must outlive the view.
+    ScoreView(MessageLoop& loop, Window& owner, HighScores& highScores, std::int16_t layoutUnit);
+
+    std::int16_t modeNum = 0;  // the table to show, 1 to 3; set it before the view is shown
+
+ private:
+    void Form_Load() override;
+    Task<> Form_MouseDown(float x, float y) override;
+    Task<> Form_MouseMove(float x, float y) override;
+    Task<> Form_KeyPress(std::int16_t key) override;
+    void closeStats() { unload(); }
+    void clearScores();
+
+    void layOut();
+    ScreenButton layOutButton(std::int32_t leftUnits);
+    void drawTitle();
+    void drawRow(std::size_t place);
+    void drawButton(std::size_t i, bool highlighted);
+
+    HighScores& highScores_;
+    std::int32_t unit_;
+    ScreenButton background_;
+    ScreenButton title_;
+    std::array<ScreenButton, 2> buttons_;
+};
+
+}  // namespace quabble

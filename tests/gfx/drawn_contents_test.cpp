@@ -1,0 +1,165 @@
+#include <gtest/gtest.h>
+
+#include <fstream>
+
+#include "gfx/message_template.hpp"
+#include "gfx/painters.hpp"
+#include "gfx/result_dialog.hpp"
+#include "gfx/sprite_sheet.hpp"
+#include "gfx/string_table.hpp"
+#include "pictures.hpp"
+#include "platform/headless/scripted_user.hpp"
+
+namespace quabble {
+namespace {
+
+class Painters : public testing::Test {
+ protected:
+    Painters() {
+        for (std::uint32_t i = 0; i < 838 * 400; ++i)
+            sheet.row(static_cast<std::int32_t>(i / 400))[i % 400] = i;
+    }
+    Surface sheet{400, 838};  // every pixel is another one
+    Canvas drawn{Surface(360, 470), {Typeface::SansBold, 14}}, expected = drawn;
+    ScreenButton box{&drawn, 20, 10, 70, 24, false, palette::backgroundBrush, {}, {250, 240, 10}, 28};
+};
+
+TEST_F(Painters, ClipEachCopyOfATextToItsOwnRectangle) {
+    constexpr const char* text = "Wider lines\nof text jump";
+    for (const std::int32_t format : {-1, 1, 4 + 32, 1 + 4 + 32}) {
+        const bool label = format == 1 + 4 + 32;
+        expected.picture.fill({20, 10, 90, 34}, {62, 105, 214});
+        drawText(expected.picture, {20, 10, 90, 34}, text, std::max(format, 0), {}, drawn.font);
+        drawText(expected.picture, label ? Rect{20, 10, 97, 27} : Rect{27, 3, 90, 34}, text,
+                 std::max(format, 0), label ? Colour{200, 220, 180} : Colour{250, 240, 10}, drawn.font);
+        drawLabelledBox(box, BoxStyle::Plain, label, 7, label ? text : "");
+        if (!label)
+            drawShadowText(box, 7, text, format);
+        EXPECT_TRUE(same(drawn.picture, expected.picture)) << format;
+    }
+}
+
+TEST_F(Painters, CopyTheTilesOfTheBoardAndTheWaitingRow) {
+    PlayGrid grid;
+    grid.recreate(12, 16);
+    grid.forEachCell([&](CellPosition place, GridCell& cell) {
+        cell.tile = static_cast<std::int16_t>((place.column + 5 * place.row) % 14);
+        const Rect square = Rect::ofSize(28 * place.column - 8, 28 * place.row - 18, 28, 28);
+        expected.picture.copy(square, sheet, {28 * cell.tile, 0});
+    });
+    drawBoard(box, sheet, grid);
+    EXPECT_TRUE(same(drawn.picture, expected.picture));
+    sheet.fill({252, 0, 280, 28}, {0x12, 0x34, 0x56});
+    sheet.fill({0, 28, 28, 56}, {0, 0, 0xF0});
+    for (const auto& [revealed, hidden] : {std::pair{0, 11}, {4, 7}, {10, 1}, {11, 0}}) {
+        for (std::int32_t i = 0; i < 12; ++i)
+            expected.picture.fill(Rect::ofSize(20 + 28 * i, 10, 28, 28), {0x12, 0x34, 0x56});
+        for (std::int32_t i = 0; i < hidden; ++i)
+            expected.picture.fill(Rect::ofSize(20 + 28 * i, 10, 28, 28), {0, 0, 0x50});
+        drawPreviewRow(box, sheet, GridRow(12, GridCell::bomb(3)), static_cast<std::int16_t>(revealed));
+        EXPECT_TRUE(same(drawn.picture, expected.picture)) << revealed;
+    }
+}
+
+TEST_F(Painters, FillTheGaugeFromTheTopAndCopyNoMoreThanThereIs) {
+    for (const auto& [part, full] : {std::pair{150., 241}, {99.8, 241}, {99.7, 240}, {50., 120}, {0., 0}}) {
+        expected.picture.copy({20, 10, 90, 10 + 241}, sheet, {246, 29});
+        expected.picture.copy({20, 10, 90, 10 + full}, sheet, {274, 29});
+        drawGauge(box, sheet, part);
+        EXPECT_TRUE(same(drawn.picture, expected.picture)) << part;
+    }
+    expected.picture.fill({20, 10, 25, 15}, {});
+    copyPicture(box, Surface(5, 5));
+    EXPECT_TRUE(same(drawn.picture, expected.picture)) << "a picture smaller than its box";
+}
+
+TEST_F(Painters, HaveAStandInForASheetThatCannotBeUsed) {
+    const std::string folder = testing::TempDir() + "quabble_", sheetFile = folder + "ALLPICDATA.BMP";
+    std::string good("BM\0\0\0\0\0\0\0\0\x36\0\0\0\x28\0\0\0\x90\1\0\0\x46\3\0\0\1\0\x18", 29);
+    good.resize(54);
+    good.resize(54 + 400 * 3 * 838, 'q');
+    const std::string aRowLess = std::string(good).replace(22, 1, "\x45");
+    for (const std::string& file : {good, aRowLess, good.substr(0, good.size() - 1), std::string()}) {
+        std::ofstream(sheetFile, std::ios::binary) << file;
+        const Surface loaded = loadGraphics(folder).spriteSheet;
+        ASSERT_TRUE(loaded.width() >= 400 && loaded.height() >= 838 && std::remove(sheetFile.c_str()) == 0);
+        for (std::int32_t i = 0, j = 0; i < 14; i += j / 13, j = (j + 1) % 14)
+            EXPECT_EQ(loaded.at(28 * i + 4, 4) == loaded.at(28 * j + 4, 4), file == good || i == j) << i;
+    }
+}
+
+TEST(Texts, KeysAreReplacedPairByPair) {
+    EXPECT_EQ(fillText("|1-|1|", {"|1", 7}), "7-7|");
+    EXPECT_EQ(fillText("|1 |2", {"|1", "|2", "|2", 5}), "5 5");
+    EXPECT_EQ(fillText("|1 |2", {"|1", -120, "|2"}), "-120 -120");
+    EXPECT_EQ(fillText("a|1b ||22", {"|1", "", "|2"}), "ab ");
+    EXPECT_TRUE(loadString(38) == "Exit" && loadString(73) == "Best Val" && loadString(90) == "End game");
+}
+
+class Result : public testing::Test {
+ protected:
+    std::string textOf(GameMode mode, std::int16_t level, bool goNextLevel) {
+        game.gameMode = mode;
+        game.stats = {120, 14, 6, level, 999};
+        return resultText(game, goNextLevel);
+    }
+    GameState game;
+    HeadlessFrontEnd frontEnd{""};
+    MessageLoop loop{frontEnd};
+    ScriptedUser user{frontEnd, loop};
+    Window owner{loop};
+    ResultDialog dialog{loop, owner, game, 45};
+};
+
+TEST_F(Result, TellsHowTheGameOrLevelEnded) {
+    const std::string done = "Congrats ! You have finished all levels !", over = "Game Over";
+    const std::string figures = "  Number of Blocks Cleared 14 \n  Largest Cluster 6 \n";
+    const std::string score = "\r\nscore : 120 \n", level = score + " Current Level 10 \n" + figures;
+    const std::string completed = "Level Completed\r\nAdvance to  Level 10 \n score : 120 \n" + figures;
+    const std::tuple<std::int16_t, bool, std::string, std::string> cases[] = {
+        {10, false, over + level, over + level},
+        {9, true, completed, completed},
+        {10, true, done, done + level},
+        {11, false, done, done + score + " Current Level 11 \n" + figures}};
+    for (const auto& [number, goNextLevel, timed, strategy] : cases) {
+        EXPECT_EQ(textOf(GameMode::Timed, number, goNextLevel), timed);
+        EXPECT_EQ(textOf(GameMode::Strategy, number, goNextLevel), strategy);
+    }
+    EXPECT_EQ(textOf(GameMode::Training, 1, false), over + score + figures);
+}
+
+TEST_F(Result, ShowsItsLinesWholeAndHighlightsItsButtonUntilItCloses) {
+    Surface expected(457, 265);
+    using enum EventKind;
+    const std::pair<EventKind, short> ways[] = {
+        {MouseDown, 0}, {CloseButton, 0}, {KeyPress, 13}, {KeyPress, 27}};
+    const float path[][2] = {{230, 234}, {230, 233}, {187, 219}, {186, 219}, {230, 204}, {230, 205}};
+    const std::string lines = textOf(GameMode::Strategy, 11, false);
+    drawText(expected, {47, 43, 418, 999}, lines, 1, {180, 180, 140}, {Typeface::Sans, 12});
+    for (const auto& way : ways) {
+        Task<> showing = loop.showModal(dialog);
+        showing.start();
+        int timesShown = 1, hovered = 0;
+        for (const auto& [x, y] : path) {
+            const bool over = y > 204 && y < 234 && x > 186 && x < 276;
+            timesShown += over != std::exchange(hovered, over);
+            const Colour colour = over ? Colour{200, 220, 180} : Colour{180, 180, 140};
+            const Rect front{186, 204, over ? 284 : 282, over ? 226 : 228};
+            expected.fill({186, 204, 276, 234}, {62, 105, 214});
+            expected.outline({186, 204, 276, 234}, {170, 170, 100});
+            expected.outline(over ? Rect{187, 205, 275, 233} : Rect{}, colour);
+            drawText(expected, {186, 204, 276, 234}, "OK", 1 + 4 + 32, {}, {Typeface::Sans, 14});
+            drawText(expected, front, "OK", 1 + 4 + 32, colour, {Typeface::Sans, 14});
+            user.movePointer(x, y);
+            EXPECT_EQ(user.top().timesShown, timesShown) << x << "," << y;
+            EXPECT_TRUE(same(user.top().picture, expected)) << x << "," << y;
+            loop.post({user.topWindow(), over ? KeyPress : MouseDown, x, y, 'o'});
+        }
+        loop.post({user.topWindow(), way.first, 186.5F, 204.5F, way.second});
+        loop.wake();
+        EXPECT_TRUE(showing.done() && frontEnd.windows().empty()) << way.second;
+    }
+}
+
+}  // namespace
+}  // namespace quabble

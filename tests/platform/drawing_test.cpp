@@ -1,0 +1,61 @@
+#include <gtest/gtest.h>
+
+#include "pictures.hpp"
+#include "platform/bitmap_file.hpp"
+#include "platform/text.hpp"
+
+namespace quabble {
+namespace {
+
+TEST(Drawing, ABitmapFileIsReadWholeOrNotAtAll) {
+    // 3 x 2 pixels, six bytes between the header and them; the bytes of the pixels are 1, 2, 3 and so on.
+    std::string good("BM\0\0\0\0\0\0\0\0\x3C\0\0\0\x28\0\0\0\3\0\0\0\2\0\0\0\1\0\x18", 29);
+    good.resize(60);
+    for (char byte = 1; byte <= 24; ++byte)
+        good += byte;
+    const std::string fromTop = std::string(good).replace(22, 4, "\376\377\377\377");
+    const auto decode = [](const std::string& file) { return decodeBitmap(std::as_bytes(std::span(file))); };
+    ASSERT_TRUE(decode(good) && decode(fromTop) && decode(good)->bounds() == (Rect{0, 0, 3, 2}));
+    EXPECT_EQ(decode(good)->at(2, 0), (Colour{21, 20, 19}));
+    EXPECT_EQ(decode(fromTop)->at(2, 1), (Colour{21, 20, 19}));
+    for (std::size_t size = 0; size < good.size(); ++size)
+        EXPECT_FALSE(decode(good.substr(0, size))) << size;
+    for (std::size_t i = 0; i < 54 * 256; ++i) {
+        const std::size_t at = i / 256;
+        for (std::string file : {good, fromTop}) {
+            file[at] = static_cast<char>(i);
+            const auto picture = decode(file);
+            const bool spoilt = file[at] != good[at] && (at < 2 || (at >= 28 && at < 34));
+            const int end = picture ? file[10] + (picture->width() * 3 + 3) / 4 * 4 * picture->height() : 0;
+            EXPECT_FALSE(picture && (spoilt || picture->isEmpty() || file[10] < 54 || end > 84)) << at;
+        }
+    }
+}
+
+Surface written(const char* text, std::int32_t format, const Rect& area) {
+    Surface surface(120, 90);
+    drawText(surface, area, text, format, {255, 255, 255}, {Typeface::Sans, 14});
+    return surface;
+}
+
+TEST(Drawing, TextIsBrokenCentredAndClipped) {
+    const auto [width, height] = measureText("Wj \xC4 lines", {Typeface::Sans, 14});
+    for (const Rect& area : {Rect{20, 10, 110, 80}, Rect{-4, 10, 86, 200}, Rect{50, 10, 80, 20}}) {
+        const Rect clip = area.intersection({0, 0, 120, 90});
+        const std::int32_t x = area.left + (area.width() - width) / 2, y = 10 + (area.height() - height) / 2;
+        for (const std::int32_t format : {0, 1, 1 + 4, 1 + 4 + 32}) {
+            Surface lines =
+                written("Wj \xC4 lines", 0, {format == 0 ? area.left : x, format > 32 ? y : 10, 120, 90});
+            if (format < 32)
+                lines.copy({0, 10 + 2 * height, 120, 90}, lines, {0, 10});
+            Surface expected(120, 90);
+            expected.copy(clip, lines, {clip.left, clip.top});
+            const char* text = format < 32 ? "Wj \xC4 lines\r\n\nWj \xC4 lines\n" : "Wj \xC4 lines";
+            EXPECT_TRUE(same(written(text, format, area), expected)) << area.left << " " << format;
+        }
+    }
+    EXPECT_NEAR(measureText("012345\x80", {Typeface::SansBold, 14}).width, 7 * 1139 / 2048.0 * 14 * 4 / 3, 1);
+}
+
+}  // namespace
+}  // namespace quabble
