@@ -103,6 +103,20 @@ void Desktop::press(KeySym keysym) {
     XSync(display_, False);
 }
 
+void Desktop::type(const std::string& lowerCaseLetters) {
+    for (const char letter : lowerCaseLetters)
+        press(static_cast<unsigned char>(letter));  // a letter's keysym is its character
+}
+
+void Desktop::waitForFocus(WindowOnScreen window) {
+    waitUntil("the keyboard's focus", [&] {
+        ::Window focused = None;
+        int revert = 0;
+        XGetInputFocus(display_, &focused, &revert);
+        return focused == window;
+    });
+}
+
 Surface Desktop::look(::Window window) {
     XWindowAttributes attributes{};
     XGetWindowAttributes(display_, window, &attributes);

@@ -28,6 +28,9 @@ class Desktop {
     void clickCloseButton(WindowOnScreen window);
     void press(unsigned long keysym);
 
+    void type(const std::string& lowerCaseLetters);
+    void waitForFocus(WindowOnScreen window);
+
     // What is seen of a window's client area.
     Surface look(WindowOnScreen window);
 

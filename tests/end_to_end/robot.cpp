@@ -2,15 +2,18 @@
 // real pointer, keeps its own count of the score and compares the panel and the result dialog with it.
 
 #include <X11/keysym.h>
+#include <sqlite3.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
 #include <algorithm>
 #include <chrono>
 #include <cstdio>
+#include <cstdlib>
 #include <filesystem>
 #include <string>
 #include <thread>
+#include <utility>
 
 #include "desktop.hpp"
 #include "gfx/painters.hpp"
@@ -26,6 +29,7 @@ using namespace std::chrono_literals;
 constexpr int cellSize = 28;
 constexpr int boardLeft = 232;
 constexpr const char* mainCaption = "Quabble  Ver 1.0";
+constexpr const char* playerName = "robot";
 
 bool isSame(const Surface& seen, const Rect& area, const Surface& expected, Point from) {
     Surface cut(area.width(), area.height());
@@ -41,14 +45,18 @@ bool isSame(const Surface& seen, const Rect& area, const Surface& expected, Poin
 
 class Robot {
  public:
-    explicit Robot(const std::string& program)
-        : sheet_(loadGraphics(std::filesystem::path(program).parent_path().string() + "/").spriteSheet) {
+    explicit Robot(std::string program)
+        : program_(std::move(program)),
+          sheet_(loadGraphics(std::filesystem::path(program_).parent_path().string() + "/").spriteSheet) {}
+
+    void startProgram() {
         child_ = fork();
         if (child_ == 0) {
-            execl(program.c_str(), program.c_str(), nullptr);
+            execl(program_.c_str(), program_.c_str(), nullptr);
             _exit(127);
         }
         main_ = desktop_.waitForWindow(mainCaption);
+        desktop_.waitForFocus(main_);
         std::this_thread::sleep_for(500ms);
     }
 
@@ -77,7 +85,36 @@ class Robot {
         if (!hasEnded())
             desktop_.click(main_, 95, training ? 385 : 465);
         checkResult(mode);
+        enterName();
+        checkBestEntry();
         std::printf("mode %d: %d moves, %d points, as counted\n", static_cast<int>(mode), made, score_);
+    }
+
+    // The score of the last game stands at the top of its mode's table, opened from the main menu.
+    void checkTable(GameMode mode) {
+        desktop_.click(main_, 337, 15 + (static_cast<int>(mode) + 3) * 52 + 2);
+        checkBestEntry();
+    }
+
+    // The same, in the file that it is kept in.
+    void checkStore(GameMode mode) {
+        const std::string path = std::string(std::getenv("XDG_DATA_HOME")) + "/quabble/registry.db";
+        sqlite3* store = nullptr;
+        require(sqlite3_open_v2(path.c_str(), &store, SQLITE_OPEN_READONLY, nullptr) == SQLITE_OK, path);
+        const std::string table = std::to_string(static_cast<int>(mode)) + "STATS";
+        const std::string query =
+            "SELECT hex(data) FROM entries WHERE name IN ('" + table + "', '" + table + "1')";
+        std::string found;
+        const auto collect = [](void* all, int, char** row, char**) {
+            *static_cast<std::string*>(all) += std::string(row[0]) + " ";
+            return 0;
+        };
+        sqlite3_exec(store, query.c_str(), collect, &found, nullptr);
+        sqlite3_close(store);
+        char expectedScore[9];
+        std::snprintf(expectedScore, sizeof expectedScore, "%02X%02X0000", score_ & 0xFF, score_ >> 8);
+        require(found.find(expectedScore) != std::string::npos, "the stored score, in " + found);
+        require(found.find("726F626F7400 ") != std::string::npos, "the stored name, in " + found);
     }
 
     void closeAndCheckExit() {
@@ -165,11 +202,39 @@ class Robot {
         waitUntil("the result as counted", [&] {
             return isSame(desktop_.look(dialog), text.rect(), expected.picture, {text.left, text.top});
         });
+        desktop_.waitForFocus(dialog);
         desktop_.press(XK_Return);
         waitUntil("the dialog's end", [this] { return !hasEnded(); });
     }
 
+    void enterName() {
+        desktop_.waitForFocus(desktop_.waitForWindow("Best Score"));
+        desktop_.type(playerName);
+        desktop_.press(XK_Return);
+    }
+
+    void checkBestEntry() {
+        const WindowOnScreen view = desktop_.waitForWindow("Best Scores - Quabble");
+        Canvas expected{Surface(473, 473), {Typeface::SerifBold, 14.25, false}};
+        expected.picture.fill(expected.picture.bounds(), palette::backgroundColour);
+        ScreenButton box{.surface = &expected,
+                         .left = 45,
+                         .top = 45,
+                         .width = 270,
+                         .height = 45,
+                         .textColour = palette::highlightColour};
+        drawShadowText(box, 1, playerName, defaultTextFormat);
+        box.left = 360;
+        drawShadowText(box, 1, std::to_string(score_), defaultTextFormat);
+        waitUntil("the best score and its name",
+                  [&] { return isSame(desktop_.look(view), {45, 45, 450, 90}, expected.picture, {45, 45}); });
+        desktop_.waitForFocus(view);
+        desktop_.press(XK_Return);
+        waitUntil("the view's end", [this] { return !desktop_.hasWindow("Best Scores - Quabble"); });
+    }
+
     Desktop desktop_;
+    std::string program_;
     Surface sheet_;
     pid_t child_ = 0;
     WindowOnScreen main_ = 0;
@@ -185,9 +250,14 @@ class Robot {
 int main(int argc, char** argv) {
     quabble::require(argc == 2, "usage: robot PROGRAM");
     quabble::Robot robot(argv[1]);
+    robot.startProgram();
     robot.play(quabble::GameMode::Training, 1000);
     robot.play(quabble::GameMode::Strategy, 12);
     robot.play(quabble::GameMode::Timed, 4);
+    robot.closeAndCheckExit();
+    robot.checkStore(quabble::GameMode::Timed);
+    robot.startProgram();
+    robot.checkTable(quabble::GameMode::Timed);
     robot.closeAndCheckExit();
     return 0;
 }
