@@ -17,7 +17,7 @@ packages_of() {
         *) return 1 ;;
     esac
     [ "$2" = play ] ||
-        list+=" libgtest-dev clang-19 clang-format-19 clang-tidy-19 xvfb openbox libxtst-dev"
+        list+=" libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 xvfb openbox libxtst-dev"
     printf '%s' "$list"
 }
 

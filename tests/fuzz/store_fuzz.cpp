@@ -1,0 +1,83 @@
+// Feeds any bytes to the settings: as the registry's file itself, and as values of a sound registry. The
+// first byte says which. What was loaded is saved and loaded again.
+
+#include <unistd.h>
+
+#include <cassert>
+#include <cstdio>
+#include <fstream>
+#include <span>
+#include <string>
+
+#include "platform/headless/headless_front_end.hpp"
+#include "store/settings_store.hpp"
+
+namespace quabble {
+namespace {
+
+struct Store {
+    Settings settings;
+    HighScores highScores;
+};
+
+Store load(Registry& registry) {
+    HeadlessFrontEnd frontEnd("");
+    Store store;
+    loadSettings(store.settings, store.highScores, registry, frontEnd);
+    return store;
+}
+
+void requireRoundTrip(Registry& registry) {
+    HeadlessFrontEnd frontEnd("");
+    const Store loaded = load(registry);
+    saveSettings(loaded.settings, loaded.highScores, registry, frontEnd);
+    if (!frontEnd.messages.empty())
+        return;
+    const Store again = load(registry);
+    assert(again.settings.solvingData.bytes == loaded.settings.solvingData.bytes);
+    assert(again.settings.soundOptions == loaded.settings.soundOptions);
+    for (std::int16_t table = 1; table <= highScoreTables; ++table)
+        assert(again.highScores.table(table).scores == loaded.highScores.table(table).scores);
+}
+
+void tryAsFile(std::span<const unsigned char> bytes) {
+    const std::string path = "/tmp/quabble_store_fuzz_" + std::to_string(getpid());
+    std::ofstream(path, std::ios::binary)
+        .write(reinterpret_cast<const char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()));
+    Registry registry(path);
+    requireRoundTrip(registry);
+    std::remove(path.c_str());
+    std::remove((path + "-journal").c_str());
+}
+
+// Values one after another: a byte that chooses the name, a byte for the size, then the bytes themselves.
+void tryAsValues(std::span<const unsigned char> bytes) {
+    static const std::string names[] = {"SOLVINGDATA", "NUMWFSF", "SOUNDOPTIONS", "1STATS",
+                                        "2STATS",      "1STATS1", "3STATS8"};
+    Registry registry = Registry::inMemory();
+    {
+        auto software = registry.openKey("Software");
+        auto key = software->createKey("Vorlane\\Quabble\\1.0", "USERDATA");
+        while (bytes.size() >= 2) {
+            const std::string& name = names[bytes[0] % std::size(names)];
+            const auto value = bytes.subspan(2, std::min<std::size_t>(bytes[1], bytes.size() - 2));
+            key->set(name, ValueType::Binary, std::as_bytes(value));
+            bytes = bytes.subspan(2 + value.size());
+        }
+    }
+    requireRoundTrip(registry);
+}
+
+}  // namespace
+}  // namespace quabble
+
+extern "C" int LLVMFuzzerTestOneInput(const unsigned char* data, std::size_t size) {
+    if (size == 0)
+        return 0;
+    const auto bytes = std::span(data, size).subspan(1);
+    if (data[0] % 2 == 0)
+        quabble::tryAsFile(bytes);
+    else
+        quabble::tryAsValues(bytes);
+    return 0;
+}
