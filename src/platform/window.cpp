@@ -161,12 +161,11 @@ void Window::editText(const InputEvent& event) {
 }
 
 void Window::focusNext() {
-    auto next = std::ranges::find(controls_, focus_);
-    do {
-        ++next;
-        if (next == controls_.end())
-            next = controls_.begin();
-    } while (!(*next)->takesFocus() || !(*next)->visible);
+    const auto takesFocus = [](const Control* control) { return control->visible && control->takesFocus(); };
+    const auto current = std::ranges::find(controls_, focus_);
+    auto next = std::find_if(current + 1, controls_.end(), takesFocus);
+    if (next == controls_.end())
+        next = std::ranges::find_if(controls_, takesFocus);
     setFocus(*next);
 }
 

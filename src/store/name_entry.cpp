@@ -16,7 +16,7 @@ constexpr const char* congratulation = " Congratulations ! \r\n Your Score is am
 
 }  // namespace
 
-std::string acceptedName(std::string typed) {
+std::string acceptedName(const std::string& typed) {
     if (typed.empty())
         return "-";
     return typed.substr(0, longestName);

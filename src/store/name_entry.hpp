@@ -9,7 +9,7 @@
 namespace quabble {
 
 // The name that goes into a table for what was typed: at most 19 characters, and "-" for none at all.
-std::string acceptedName(std::string typed);
+std::string acceptedName(const std::string& typed);
 
 // The dialog that asks the player of a high score for a name. However it is closed, the name is what then
 // stands in its box.

@@ -18,8 +18,8 @@ constexpr int commandNotFound = 127;
         ::_exit(0);
     if (::chdir(folder) != 0)
         ::_exit(commandNotFound);
-    const int nowhere = ::open("/dev/null", O_RDWR);
-    ::dup2(nowhere, STDIN_FILENO);
+    ::close(STDIN_FILENO);
+    ::open("/dev/null", O_RDONLY);  // becomes the standard input
     ::execvp(arguments[0], arguments);
     ::_exit(commandNotFound);
 }
@@ -28,6 +28,7 @@ constexpr int commandNotFound = 127;
 
 void startDetached(const std::vector<std::string>& command, const std::string& folder) {
     std::vector<char*> arguments;
+    arguments.reserve(command.size() + 1);
     for (const std::string& argument : command)
         arguments.push_back(const_cast<char*>(argument.c_str()));
     arguments.push_back(nullptr);
