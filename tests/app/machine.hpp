@@ -1,72 +1,130 @@
 #pragma once
 
-#include <cstdint>
-#include <string>
-#include <string_view>
-#include <vector>
+#include <stb/stb_image_write.h>
 
-#include "app/app_state.hpp"
-#include "base/task.hpp"
-#include "platform/headless/headless_front_end.hpp"
+#include <filesystem>
+#include <random>
+#include <set>
+
+#include "app/program.hpp"
+#include "gfx/painters.hpp"
 #include "platform/headless/scripted_user.hpp"
-#include "platform/message_loop.hpp"
 
 namespace quabble {
-
-// The pictures that the tests run on: every area of the sheet is flat and has a colour of its own.
-namespace sheet {
-constexpr Colour mask{0x55, 0x33, 0x0F};
-constexpr Colour emptyGauge{1, 2, 3};
-constexpr Colour fullGauge{250, 251, 252};
-constexpr Colour panel{90, 10, 130};
-Colour tile(std::int16_t number);
-}  // namespace sheet
 
 // How a tile is written, by its number; rows of tiles are separated by blanks.
 constexpr std::string_view tileLetters = ".1234#sabcWXYZ";
 
-// The program's red, green and blue bytes of a picture, row by row.
-std::vector<unsigned char> bytesOf(const Surface& picture);
+// The sprite sheet of the tests: every area is flat and has a colour of its own.
+constexpr Colour maskColour{0x55, 0x33, 0x0F};
+constexpr Colour fullGaugeColour{250, 251, 252};
+inline Colour tileColour(std::int16_t tile) {
+    return colourOf(static_cast<std::uint32_t>(0x0AF000 + tile * 0x11F035));
+}
 
-// The program, started on a machine without a screen and left on its main menu. No score of the tests enters
-// a table.
-class Machine {
- public:
-    explicit Machine(std::uint64_t seed = 1);
+inline std::vector<unsigned char> bytesOf(const Surface& picture) {
+    std::vector<unsigned char> bytes;
+    for (std::int32_t y = 0; y < picture.height(); ++y) {
+        for (const std::uint32_t pixel : picture.row(y))
+            bytes.insert(bytes.end(), {colourOf(pixel).red, colourOf(pixel).green, colourOf(pixel).blue});
+    }
+    return bytes;
+}
 
-    HeadlessFrontEnd frontEnd;
-    MessageLoop loop;
+inline bool isFlat(const Surface& picture, const Rect& area) {
+    std::set<std::uint32_t> colours;
+    for (std::int32_t i = 0; i < area.width() * area.height(); ++i)
+        colours.insert(pixelOf(picture.at(area.left + i % area.width(), area.top + i / area.width())));
+    return colours.size() == 1;
+}
+
+// The program's folder with the sheet in it; it goes with the process.
+struct ProgramFolder {
+    std::filesystem::path path =
+        std::filesystem::temp_directory_path() / ("quabble" + std::to_string(std::random_device{}()));
+
+    ProgramFolder() {
+        Surface picture(400, 838);
+        for (std::int16_t tile = 0; tile < tiles::count; ++tile)
+            picture.fill(Rect::ofSize(tile * 28, 0, 28, 28), tileColour(tile));
+        picture.fill(Rect::ofSize(0, 28, 28, 28), maskColour);
+        picture.fill(Rect::ofSize(274, 29, 30, 241), fullGaugeColour);
+        picture.fill(Rect::ofSize(0, 338, 400, 500), {90, 10, 130});
+        std::filesystem::create_directory(path);
+        stbi_write_bmp((path / "ALLPICDATA.BMP").c_str(), 400, 838, 3, bytesOf(picture).data());
+    }
+    ~ProgramFolder() { std::filesystem::remove_all(path); }
+};
+inline const ProgramFolder programFolder;
+
+// The program on its main menu, with high scores that are out of reach. Buttons are counted from 1.
+struct Machine {
+    HeadlessFrontEnd frontEnd{programFolder.path.string()};
+    MessageLoop loop{frontEnd};
+    Registry registry = Registry::inMemory();
     AppState app;
-    ScriptedUser user;
-    GameState& game;
+    ScriptedUser user{frontEnd, loop};
+    GameState& game = app.game;
+    Task<> program = runProgram(app);
 
-    // Buttons are counted from 1, panel entries likewise in the panel of the game being played.
-    void clickMenu(int button);
-    void pointAtMenu(int button);
-    void clickPanel(int entry);
-    void clickCell(int column, int row);
+    explicit Machine(std::uint64_t seed = 1) : app(loop, registry, seed) {
+        frontEnd.connect(loop);
+        program.start();
+        user.wait(std::chrono::minutes(1));  // until the main menu is there
+        for (std::int16_t table = 1; table <= highScoreTables; ++table)
+            app.highScores.table(table).scores.fill(1'000'000'000);
+    }
+
+    void pointAtMenu(int button) { user.movePointer(337, static_cast<float>(52.5 * button + 15)); }
+    void clickMenu(int button) { user.click(337, static_cast<float>(52.5 * button + 15)); }
+    void clickPanel(int entry) { user.click(95, static_cast<float>(65 + 40 * entry)); }
     void clickStrip() { user.click(400, 515); }
+    void clickCell(int column, int row) {
+        const Rect square = cell(column, row);
+        user.click(static_cast<float>(square.left + 14), static_cast<float>(square.top + 14));
+    }
     void closeDialog() { user.press(keys::enter); }
 
-    // Starts a game by its menu button and puts rows of tiles at the bottom of an otherwise empty board.
-    void start(int button, std::string_view rows);
-    void setBoard(std::string_view rows);
+    // Starts a game with rows of tiles at the bottom of an otherwise empty board.
+    void start(int button, std::string_view rows) {
+        clickMenu(button);
+        setBoard(rows);
+    }
+    void setBoard(std::string_view rows) {
+        const std::string board(207 - rows.size(), '.');
+        game.grid.recreate(12, 16);
+        game.grid.forEachCell([&](CellPosition place, GridCell& held) {
+            const auto at = static_cast<std::size_t>(13 * place.row + place.column - 14);
+            const auto tile = static_cast<std::int16_t>(tileLetters.find((board + std::string(rows))[at]));
+            const auto kind = tile > 6 ? CellKind::Bomb : tile == 5 ? CellKind::Stone : CellKind::Block;
+            held = {kind, static_cast<std::int16_t>(tile > 6 ? tile - 6 : tile), tile, 0};
+        });
+        ScreenButton box{.surface = &app.frmQuabble().canvas(), .left = 232, .top = cell(1, 1).top};
+        box.cellSize = 28;
+        drawBoard(box, app.pictures.spriteSheet, game.grid);
+        app.frmQuabble().refresh();
+    }
 
     bool hasDialog() const { return frontEnd.windows().size() > 1; }
-    HeadlessFrontEnd::Shown mainWindow() { return frontEnd.windows().at(app.frmQuabble().id()); }
-    const Surface& mainPicture() { return frontEnd.windows().at(app.frmQuabble().id()).picture; }
-    std::int32_t boardTop() const { return game.gameMode == GameMode::Training ? 37 : 31; }
-    // The board's last rows, read from the main window's pixels.
-    std::string seenRows(int rows);
-    // True when a cell shows more than its tile.
-    bool isWrittenOn(int column, int row);
-    // True when the program waits for something to happen, not for a time to pass.
-    bool isIdle();
-
- private:
-    Rect cellArea(int column, int row) const;
-
-    Task<> program_;
+    bool isPaused() { return app.frmQuabble().isPaused(); }
+    const auto& shown() { return frontEnd.windows().at(app.frmQuabble().id()); }
+    const Surface& picture() { return shown().picture; }
+    Rect cell(int column, int row) const {
+        const int above = game.gameMode == GameMode::Training ? 9 : 3;
+        return Rect::ofSize(204 + column * 28, above + row * 28, 28, 28);
+    }
+    std::string seenRows(int rows) {  // the board's last ones, read from the pixels
+        std::string seen;
+        for (int i = (16 - rows) * 12; i < 192; ++i) {
+            const Rect square = cell(i % 12 + 1, i / 12 + 1);
+            std::int16_t tile = 0;
+            while (tile < tiles::count && tileColour(tile) != picture().at(square.left, square.bottom - 1))
+                ++tile;
+            seen += seen.size() % 13 == 12 ? " " : "";
+            seen += tile < tiles::count ? tileLetters[static_cast<std::size_t>(tile)] : '?';
+        }
+        return seen;
+    }
 };
 
 }  // namespace quabble

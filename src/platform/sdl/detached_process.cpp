@@ -18,6 +18,9 @@ constexpr int commandNotFound = 127;
         ::_exit(0);
     if (::chdir(folder) != 0)
         ::_exit(commandNotFound);
+    sigset_t none;
+    ::sigemptyset(&none);
+    ::sigprocmask(SIG_SETMASK, &none, nullptr);
     ::close(STDIN_FILENO);
     ::open("/dev/null", O_RDONLY);  // becomes the standard input
     ::execvp(arguments[0], arguments);

@@ -121,29 +121,55 @@ void SdlFrontEnd::run(MessageLoop& loop) {
 // Blocks until something has happened or the program's wait is over, then posts all that has happened.
 void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
     SDL_Event event;
-    const auto deadline = loop.nextDeadline();
-    int any = 0;
-    if (deadline) {
-        const auto left = std::chrono::ceil<milliseconds>(*deadline - now());
-        any = SDL_WaitEventTimeout(&event, static_cast<int>(std::max<std::int64_t>(left.count(), 0)));
-    } else {
-        any = SDL_WaitEvent(&event);
+    if (SDL_PollEvent(&event) == 0) {
+        desktopWait_.sleep(windows_.empty() ? nullptr : windows_.begin()->second->sdl(), timeLeft(loop));
+        if (SDL_PollEvent(&event) == 0)
+            return;
     }
-    for (; any != 0; any = SDL_PollEvent(&event)) {
+    do {
         if (event.type == SDL_QUIT) {
             loop.requestEnd();
             return;
         }
-        const WindowId window = idOf(windowOf(event));
-        if (event.type == SDL_WINDOWEVENT && (event.window.event == SDL_WINDOWEVENT_EXPOSED ||
-                                              event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED)) {
-            if (DesktopWindow* shown = find(window))
-                shown->showAgain();
-        }
-        if (auto input = translate(event)) {
-            input->window = window;
-            loop.post(*input);
-        }
+        take(event, loop);
+    } while (SDL_PollEvent(&event) != 0);
+}
+
+std::optional<milliseconds> SdlFrontEnd::timeLeft(const MessageLoop& loop) {
+    const auto deadline = loop.nextDeadline();
+    if (!deadline)
+        return std::nullopt;
+    return std::max(std::chrono::ceil<milliseconds>(*deadline - now()), milliseconds::zero());
+}
+
+void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
+    const WindowId window = idOf(windowOf(event));
+    if (event.type == SDL_WINDOWEVENT && (event.window.event == SDL_WINDOWEVENT_EXPOSED ||
+                                          event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED)) {
+        if (DesktopWindow* shown = find(window))
+            shown->showAgain();
+    }
+    auto input = translate(event);
+    if (!isMeantForItsWindow(event) || !input)
+        return;
+    input->window = window;
+    loop.post(*input);
+}
+
+// False for what a key does that has been held down since another window had the focus.
+bool SdlFrontEnd::isMeantForItsWindow(const SDL_Event& event) {
+    switch (event.type) {
+        case SDL_KEYDOWN:
+            textIsMeant_ =
+                heldKeys_.isMeantFor(event.key.windowID, event.key.keysym.scancode, event.key.timestamp);
+            return textIsMeant_;
+        case SDL_KEYUP:
+            heldKeys_.release(event.key.keysym.scancode);
+            return true;
+        case SDL_TEXTINPUT:
+            return textIsMeant_;
+        default:
+            return true;
     }
 }
 

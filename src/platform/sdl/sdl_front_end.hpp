@@ -2,12 +2,16 @@
 
 #include <map>
 #include <memory>
+#include <optional>
 #include <string>
 
 #include "platform/front_end.hpp"
 #include "platform/message_loop.hpp"
+#include "platform/sdl/desktop_wait.hpp"
+#include "platform/sdl/held_keys.hpp"
 
 struct SDL_Surface;
+union SDL_Event;
 
 namespace quabble {
 
@@ -46,9 +50,15 @@ class SdlFrontEnd final : public FrontEnd {
     WindowId idOf(std::uint32_t sdlWindow) const;
     Point placeOf(const NativeWindow& traits);
     void waitForEvents(MessageLoop& loop);
+    std::optional<milliseconds> timeLeft(const MessageLoop& loop);
+    void take(const SDL_Event& event, MessageLoop& loop);
+    bool isMeantForItsWindow(const SDL_Event& event);
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
     std::unique_ptr<SDL_Surface, FreeSurface> icon_;
+    DesktopWait desktopWait_;
+    HeldKeys heldKeys_;
+    bool textIsMeant_ = true;  // what the key that was pressed last types
 };
 
 }  // namespace quabble

@@ -1,0 +1,279 @@
+#include <gtest/gtest.h>
+#include <stb/stb_image.h>
+
+#include <algorithm>
+#include <memory>
+
+#include "machine.hpp"
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+// The cluster of ones at (5, 16) empties column 5 and lets column 6 fall; the fours stay, if there are any.
+constexpr const char* lastCluster = ".....2...... .....1...... ...3113.....";
+constexpr const char* cluster = ".....2.4.... .....1.4.... ...31134....";
+constexpr const char* afterMove = ".......4.... .......4.... ....3234....";
+struct MachineInAMove : Machine {
+    MachineInAMove(int mode, milliseconds at, const char* rows = cluster) {
+        start(mode, rows);
+        clickCell(5, 16);
+        user.wait(at);
+    }
+};
+
+// Compares with the picture kept under that name, which QUABBLE_REFRESH_GOLDEN=1 writes anew.
+void expectGolden(const Surface& seen, const std::string& name) {
+    const std::string kept = QUABBLE_GOLDEN_FOLDER + name;
+    const std::string written = std::getenv("QUABBLE_REFRESH_GOLDEN") ? kept : QUABBLE_SEEN_FOLDER + name;
+    const auto bytes = bytesOf(seen);
+    stbi_write_png(written.c_str(), seen.width(), seen.height(), 3, bytes.data(), 0);
+    int width = 0, height = 0;
+    stbi_uc* read = stbi_load(kept.c_str(), &width, &height, nullptr, 3);
+    const std::unique_ptr<stbi_uc, void (*)(void*)> golden(read, stbi_image_free);
+    const auto isNear = [](int left, int right) { return std::abs(left - right) <= 8; };
+    ASSERT_TRUE(golden && width == seen.width() && height == seen.height()) << kept;
+    EXPECT_TRUE(std::equal(bytes.begin(), bytes.end(), golden.get(), isNear)) << "see " << written;
+}
+
+TEST(MainMenu, HighlightsTheButtonUnderThePointer) {
+    Machine machine;
+    const auto isFramed = [&](int top) { return machine.picture().at(225, top) == palette::highlightColour; };
+    constexpr float points[][2] = {{225, 60}, {226, 60}, {450, 60}, {449.5F, 60}, {300, 52},
+                                   {300, 53}, {300, 82}, {300, 81}, {300, 95},    {300, 60}};
+    for (std::size_t i = 0; i < 10; ++i) {  // outside and inside by turns
+        machine.user.movePointer(points[i][0], points[i][1]);
+        EXPECT_EQ(isFramed(52), i % 2 == 1) << i;
+    }
+    const int presented = machine.shown().timesShown;
+    machine.pointAtMenu(2);
+    machine.user.movePointer(330, 120);
+    EXPECT_TRUE(isFramed(105) && !isFramed(52) && machine.shown().timesShown == presented + 2);
+    machine.clickMenu(2);
+    machine.clickPanel(10);
+    machine.closeDialog();
+    machine.pointAtMenu(2);
+    EXPECT_FALSE(isFramed(105)) << "after a game the button still counts as highlighted";
+    machine.pointAtMenu(8);
+    machine.pointAtMenu(2);
+    machine.user.press('q');
+    EXPECT_TRUE(isFramed(105) && machine.shown().minimised && !machine.isPaused()) << "the menu only hides";
+}
+
+TEST(TrainingGame, ShowsAMoveStepByStepAndEndsAfterTheLastOne) {
+    MachineInAMove machine(1, 0ms, lastCluster);
+    using Moment = std::tuple<milliseconds, const char*, bool>;
+    for (const auto& [later, rows, points] : {Moment{0, ".....2...... ............ ...3..3.....", true},
+                                              Moment{249, ".....2...... ............ ...3..3.....", true},
+                                              Moment{1, "............ ............ ...3.23.....", true},
+                                              Moment{249, "............ ............ ...3.23.....", true},
+                                              Moment{1, "............ ............ ....323.....", false}}) {
+        EXPECT_FALSE(machine.hasDialog());
+        machine.user.wait(later);
+        EXPECT_EQ(machine.seenRows(3), rows);
+        EXPECT_NE(isFlat(machine.picture(), machine.cell(5, 16)), points) << rows;
+    }
+    const GameStats& stats = machine.game.stats;
+    EXPECT_TRUE(machine.hasDialog() && stats.score == 6 && stats.blocksCleared == 3);
+    machine.closeDialog();
+    machine.clickMenu(1);
+    EXPECT_EQ(stats.score + stats.blocksCleared + stats.largestCluster, 0)
+        << "a second game starts at nothing";
+}
+
+TEST(Moves, DropTheClicksOnTheBoardThatComeMeanwhile) {
+    for (const auto& [mode, at] : {std::pair{1, 100ms}, {1, 400ms}, {2, 50ms}, {2, 200ms}}) {
+        MachineInAMove machine(mode, at);
+        machine.clickCell(8, 16);
+        machine.user.wait(1s);
+        EXPECT_EQ(machine.seenRows(3), afterMove) << "mode " << mode << " after " << at.count() << " ms";
+    }
+}
+
+TEST(Moves, LetEndGameActOnceWhenTheyAreDone) {
+    for (const auto& [mode, button, end] : {std::tuple{1, 8, 500ms}, {2, 10, 250ms}, {3, 10, 250ms}}) {
+        for (milliseconds at = 0ms; at < end; at += 25ms) {
+            SCOPED_TRACE(testing::Message() << "mode " << mode << " after " << at.count() << " ms");
+            MachineInAMove machine(mode, at);
+            machine.clickPanel(button);
+            machine.clickPanel(button);
+            machine.user.wait(end - at - 1ms);
+            EXPECT_FALSE(machine.hasDialog());
+            machine.user.wait(1ms);
+            EXPECT_TRUE(machine.hasDialog() && machine.seenRows(3) == afterMove);
+            machine.closeDialog();
+            machine.user.wait(10s);
+            EXPECT_TRUE(machine.game.mainMenuActive && !machine.hasDialog());
+        }
+    }
+}
+
+TEST(Program, EndsWheneverItIsAskedTo) {
+    for (int i = 0; i <= 41; ++i) {
+        MachineInAMove machine(1, i / 2 * 25ms, i == 41 ? lastCluster : cluster);  // which brings up a dialog
+        i % 2 == 0 ? machine.user.clickCloseButton() : machine.loop.requestEnd();
+        machine.user.wait(i % 2 == 0 ? 1s : 0s);
+        EXPECT_TRUE(machine.loop.ended()) << i;
+    }
+    MachineInAMove machine(1, 500ms, lastCluster);
+    machine.loop.post({machine.app.frmQuabble().id(), EventKind::CloseButton});
+    machine.loop.wake();
+    EXPECT_TRUE(machine.hasDialog() && !machine.loop.ended()) << "a dialog blocks its owner's close button";
+    machine.user.clickCloseButton();
+    machine.clickMenu(8);
+    EXPECT_TRUE(machine.loop.ended() && machine.frontEnd.windows().empty()) << "Exit";
+}
+
+TEST(Pause, CoversEverythingUntilAClickThatDoesNothingElse) {
+    for (const std::string by : {"button", "key", "frame"}) {
+        SCOPED_TRACE(by);
+        MachineInAMove machine(1, 100ms);
+        by != "button" ? by == "key" ? machine.user.press('q') : machine.user.minimise()
+                       : machine.clickPanel(6);
+        machine.user.wait(1s);
+        EXPECT_EQ(machine.shown().minimised, by != "button");
+        EXPECT_EQ(machine.picture().at(674, 561), palette::pauseBackground);
+        EXPECT_TRUE(isFlat(machine.picture(), {0, 0, 675, 250}));
+        machine.user.press('q');
+        machine.user.restore();
+        machine.user.press('q');
+        EXPECT_FALSE(machine.shown().minimised) << "a paused game does not hide";
+        const auto beneath = bytesOf(machine.app.frmQuabble().canvas().picture);
+        machine.user.movePointer(95, 385);
+        machine.clickPanel(8);
+        EXPECT_FALSE(machine.isPaused() || machine.hasDialog());
+        EXPECT_TRUE(bytesOf(machine.picture()) == beneath);
+        EXPECT_EQ(machine.seenRows(3), afterMove) << "a move goes on behind the notice";
+    }
+}
+
+// The waiting row's cells from the right: "+" shows plainly, "-" darkened.
+std::string seenStrip(Machine& machine) {
+    std::string seen;
+    for (std::int32_t i = 11; i >= 0; --i) {
+        const Colour tile = tileColour(machine.game.nextRow[static_cast<std::size_t>(i)].tile);
+        const Colour pixel = machine.picture().at(259 + 28 * i, 531);
+        seen += pixel == tile ? '+' : pixelOf(pixel) == (pixelOf(tile) & pixelOf(maskColour)) ? '-' : '?';
+    }
+    return seen;
+}
+
+TEST(TimedGame, UncoversAndPushesRowsUntilTheLevelIsComplete) {
+    Machine machine;
+    machine.clickMenu(2);
+    const auto isFull = [&](int y) { return machine.picture().at(630, 135 + y) == fullGaugeColour; };
+    for (std::size_t row = 1; row <= 48; ++row) {
+        for (std::size_t tick = 1; tick <= 12; ++tick) {
+            machine.user.wait(249ms);
+            EXPECT_EQ(seenStrip(machine), std::string(tick, '+') + std::string(12 - tick, '-')) << row;
+            if (tick == 12 && row % 8 == 0)
+                machine.setBoard("121212121212");
+            machine.user.wait(1ms);
+        }
+        EXPECT_TRUE(row != 24 || (isFull(119) && !isFull(120))) << "120.5 is rounded to the even number";
+    }
+    ASSERT_TRUE(isFull(240) && machine.hasDialog());
+    EXPECT_EQ(machine.seenRows(2).substr(0, 12), "121212121212") << "the last row has entered";
+    expectGolden(machine.user.top().picture, "level_completed.png");
+    machine.user.wait(1h);
+    machine.closeDialog();
+    EXPECT_EQ(machine.seenRows(16).find_first_not_of(". "), 13U * 11) << "5 rows on level 2";
+    machine.user.wait(166ms);
+    EXPECT_TRUE(machine.game.tickCount == 0 && !isFull(0));
+    machine.user.wait(1ms);
+    EXPECT_EQ(machine.game.tickCount, 1);
+}
+
+TEST(TimedGame, GoesOnAfterAMoveAndAPauseWhereItStopped) {
+    Machine machine;
+    machine.start(2, cluster);
+    machine.user.wait(200ms);
+    machine.clickCell(5, 16);  // the tick at 250 ms does not count
+    machine.user.wait(800ms);
+    machine.clickPanel(8);
+    machine.user.wait(10s);
+    machine.clickStrip();
+    machine.user.wait(250ms);
+    EXPECT_TRUE(machine.game.tickCount == 4 && machine.game.rowsEntered == 0) << "the click only resumed";
+}
+
+TEST(ArcadeGames, TakeARowInTheMiddleOfAMove) {
+    for (const auto& [mode, entered, lost] :
+         {std::tuple{2, 5, false}, {2, 47, false}, {2, 5, true}, {3, 47, false}, {3, 5, true}}) {
+        SCOPED_TRACE(testing::Message() << "mode " << mode << ", row " << entered << (lost ? ", lost" : ""));
+        MachineInAMove machine(mode, 0ms, lastCluster);
+        machine.game.rowsEntered = entered;
+        machine.game.grid.at({1, 1}) = lost ? GridCell::block(4) : GridCell{};
+        machine.clickStrip();
+        machine.user.wait(125ms);
+        if (!machine.hasDialog()) {
+            EXPECT_EQ(machine.seenRows(3).substr(0, 25), "............ ...3.23.....") << "fallen onto it";
+            continue;
+        }
+        machine.user.wait(1s);
+        machine.closeDialog();
+        const auto next = bytesOf(machine.picture());
+        machine.user.wait(167ms);
+        const bool ticks = mode == 2 && !lost;
+        EXPECT_EQ(machine.game.tickCount, ticks ? 1 : 0) << "ticks count again";
+        EXPECT_EQ(machine.game.rowsEntered, lost ? 5 : 0) << "the old move brings no row";
+        EXPECT_TRUE(ticks || bytesOf(machine.picture()) == next) << "and draws no more";
+    }
+}
+
+TEST(StrategyGame, IsWonAfterTenLevelsAndLostWhenTheRowOfAMoveFindsNoRoom) {
+    Machine machine;
+    machine.clickMenu(3);
+    for (int level = 1; level <= 10; ++level) {
+        for (int row = 1; row <= 45 + 3 * level; ++row) {
+            EXPECT_FALSE(machine.hasDialog()) << level;
+            machine.game.grid.recreate(12, 16);
+            machine.clickStrip();
+        }
+        EXPECT_TRUE(machine.hasDialog()) << level;
+        machine.closeDialog();
+    }
+    EXPECT_TRUE(machine.hasDialog()) << "the congratulation comes again at the end of the game";
+    machine.closeDialog();
+    machine.start(3, "2........... 1........... 1........... 1...........");
+    for (std::int16_t row = 1; row <= 16; ++row)
+        machine.game.grid.at({6, row}) = GridCell::block(static_cast<std::int16_t>(3 + row % 2));
+    machine.clickCell(1, 16);
+    machine.user.wait(350ms);
+    EXPECT_TRUE(machine.hasDialog() && !machine.game.isGameActive() && machine.game.rowsEntered == 0);
+}
+
+TEST(StrategyGame, BombExplodesFallsClosesReleasesStonesAndBringsOneRow) {
+    Machine machine;
+    machine.start(3, "....2....... ...31#a14...");
+    machine.clickCell(7, 16);
+    using Moment = std::pair<milliseconds, const char*>;
+    for (const auto& [later, rows] :
+         {Moment{0, "....2....... ...3W#WW4..."}, Moment{75, "....2....... ...3X#XX4..."},
+          Moment{75, "....2....... ...3Y#YY4..."}, Moment{75, "....2....... ...3Z#ZZ4..."},
+          Moment{100, "....2....... ...3.#..4..."}, Moment{250, "............ ...32#..4..."},
+          Moment{249, "............ ...32#..4..."}, Moment{1, "............ ...32s4....."},
+          Moment{120, "............ ...32.4....."}, Moment{100, "............ ....324....."}}) {
+        machine.user.wait(later);
+        EXPECT_EQ(machine.seenRows(2), rows);
+    }
+    machine.user.wait(99ms);
+    EXPECT_TRUE(machine.game.rowsEntered == 0 && machine.game.stats.score == 0);
+    machine.user.wait(1s);
+    EXPECT_EQ(machine.game.rowsEntered, 1);
+}
+
+TEST(Golden, MenuAndMove) {
+    Machine machine;
+    machine.pointAtMenu(3);
+    expectGolden(machine.picture(), "menu.png");
+    machine.start(1, "..12........ .112.31.3... 12112311333.");
+    machine.user.movePointer(95, 305);  // Pause is drawn back with a smaller shadow than Help
+    machine.user.movePointer(95, 385);
+    machine.clickCell(3, 16);
+    expectGolden(machine.picture(), "training_game.png");
+}
+
+}  // namespace
+}  // namespace quabble
