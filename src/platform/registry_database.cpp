@@ -87,7 +87,7 @@ bool RegistryDatabase::begin() {
 }
 
 bool RegistryDatabase::isOrBecomesRegistry() {
-    RegistryStatement check = prepare("PRAGMA quick_check(1)");
+    RegistryStatement check = prepare("PRAGMA integrity_check(1)");
     RegistryStatement version = prepare("PRAGMA user_version");
     RegistryStatement tables = prepare("SELECT count(*) FROM sqlite_schema");
     const bool isSound = check.nextRow() && check.bytes(0) == "ok" && version.nextRow() && tables.nextRow();
