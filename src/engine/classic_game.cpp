@@ -59,6 +59,7 @@ Task<> Game::standardGameBoardClick(CellPosition place) {
     if (state_.grid.closeColumns()) {
         co_await stage_.runPendingMessages();
         co_await stage_.pause(stepPause);
+        co_await stage_.runPendingMessages();  // a click in this pause, too, belongs to the move and is dropped
         if (move.isOver())
             co_return;
     }
