@@ -59,7 +59,8 @@ Task<> Game::standardGameBoardClick(CellPosition place) {
     if (state_.grid.closeColumns()) {
         co_await stage_.runPendingMessages();
         co_await stage_.pause(stepPause);
-        co_await stage_.runPendingMessages();  // a click in this pause, too, belongs to the move and is dropped
+        // A click in this pause, too, belongs to the move and is dropped.
+        co_await stage_.runPendingMessages();
         if (move.isOver())
             co_return;
     }

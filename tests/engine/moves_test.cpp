@@ -63,14 +63,16 @@ TEST_F(Moves, ClustersGoStepByStep) {
                 "board=....3/221222332211 points=6@6,14 present board=....3/221222332211 present");
     expectClick("columns to close", GameMode::Training, "....3/...13/..211332", {4, 15},
                 "score=6 board=....3/....3/..2..332 points=6@4,15 present pause=250 messages "
-                "board=....3/..2.3332 points=6@4,15 present messages pause=250 messages board=....3/...23332 present");
+                "board=....3/..2.3332 points=6@4,15 present messages pause=250 messages board=....3/...23332 "
+                "present");
     expectClick("nothing left", GameMode::Training, ".....11", {7, 16},
                 "score=3 board= points=3@7,16 present pause=250 messages board= points=3@7,16 present board= "
                 "present timer=off result:1,3,2,2 name? scores:1 timer=off menu");
     expectClick(
         "a single block left", GameMode::Training, ".....112", {6, 16},
         "score=3 board=.......2 points=3@6,16 present pause=250 messages board=.......2 points=3@6,16 "
-        "present messages pause=250 messages board=.....2 present timer=off result:1,3,2,2 name? scores:1 timer=off "
+        "present messages pause=250 messages board=.....2 present timer=off result:1,3,2,2 name? scores:1 "
+        "timer=off "
         "menu");
     expectClick("nothing to close", GameMode::Timed, "....31/....11/221222332211", {6, 14},
                 "board=....3//221222332211 score=6 points=6@6,14 present pause=125 messages "
