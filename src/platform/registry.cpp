@@ -67,11 +67,9 @@ std::optional<RegistryKey> RegistryKey::createKey(std::string_view subkey, std::
     for (std::size_t end = 0; end != std::string::npos;) {
         end = path.find('\\', end + 1);
         const std::string part = path.substr(0, end);
-        const bool made = database_->prepare("INSERT OR IGNORE INTO keys (path, class) VALUES (?1, ?2)")
-                              .bind(1, part)
-                              .bind(2, end == std::string::npos ? classString : std::string_view(""))
-                              .run();
-        if (!made)
+        auto insertion = database_->prepare("INSERT OR IGNORE INTO keys (path, class) VALUES (?1, ?2)");
+        insertion.bind(1, part).bind(2, end == std::string::npos ? classString : std::string_view(""));
+        if (!database_->change(insertion))
             return std::nullopt;
     }
     return RegistryKey(database_, std::move(path));
@@ -91,15 +89,12 @@ std::optional<RegistryKey::Found> RegistryKey::query(std::string_view name,
 }
 
 bool RegistryKey::set(std::string_view name, ValueType type, std::span<const std::byte> data) {
-    return database_
-        ->prepare(
-            "INSERT INTO entries (key, name, type, data) VALUES (?1, ?2, ?3, ?4) "
-            "ON CONFLICT (key, name) DO UPDATE SET type = ?3, data = ?4")
-        .bind(1, path_)
-        .bind(2, name)
-        .bind(3, static_cast<std::int64_t>(type))
-        .bindBytes(4, data.data(), data.size())
-        .run();
+    auto entry = database_->prepare(
+        "INSERT INTO entries (key, name, type, data) VALUES (?1, ?2, ?3, ?4) "
+        "ON CONFLICT (key, name) DO UPDATE SET type = ?3, data = ?4");
+    entry.bind(1, path_).bind(2, name).bind(3, static_cast<std::int64_t>(type));
+    entry.bindBytes(4, data.data(), data.size());
+    return database_->change(entry);
 }
 
 std::string userRegistryPath(std::string_view programName) {

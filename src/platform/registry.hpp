@@ -32,7 +32,7 @@ class RegistryKey {
     // value, it cannot be read, or it is larger than the buffer.
     std::optional<Found> query(std::string_view name, std::span<std::byte> buffer) const;
 
-    // Sets a value; false when that fails.
+    // Sets a value; false when that fails, and then nothing of the transaction will be kept.
     bool set(std::string_view name, ValueType type, std::span<const std::byte> data);
 
  private:

@@ -69,7 +69,7 @@ std::unique_ptr<RegistryDatabase> RegistryDatabase::open(const std::string& path
     if (!database || !database->begin())
         return nullptr;
     if (!database->isOrBecomesRegistry()) {
-        database->inTransaction_ = false;  // closing rolls back
+        database->abandon();
         return nullptr;
     }
     return database;
@@ -84,6 +84,18 @@ RegistryDatabase::~RegistryDatabase() {
 bool RegistryDatabase::begin() {
     inTransaction_ = execute("PRAGMA synchronous = EXTRA") && execute("BEGIN IMMEDIATE");
     return inTransaction_;
+}
+
+bool RegistryDatabase::change(RegistryStatement& statement) {
+    if (inTransaction_ && !statement.run())
+        abandon();
+    return inTransaction_;
+}
+
+// SQLite may have rolled back by itself, in which case this fails and nothing is left to do.
+void RegistryDatabase::abandon() {
+    execute("ROLLBACK");
+    inTransaction_ = false;
 }
 
 bool RegistryDatabase::isOrBecomesRegistry() {

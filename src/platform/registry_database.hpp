@@ -45,6 +45,10 @@ class RegistryDatabase {
 
     RegistryStatement prepare(std::string_view sql) { return {connection_.get(), sql}; }
 
+    // Carries out a change that is part of the transaction. When one fails, all are taken back and no other
+    // is carried out: a registry that has half of what was meant would be worse than the one before.
+    bool change(RegistryStatement& statement);
+
  private:
     struct Close {
         void operator()(sqlite3* connection) const { sqlite3_close(connection); }
@@ -52,6 +56,7 @@ class RegistryDatabase {
     explicit RegistryDatabase(sqlite3* connection) : connection_(connection) {}
     bool execute(const char* sql);
     bool begin();
+    void abandon();
     bool isOrBecomesRegistry();
 
     std::unique_ptr<sqlite3, Close> connection_;

@@ -36,8 +36,8 @@ constexpr const char* unknownName = "Anononymous";
 // of its own; when the registry cannot be opened the user is told and everything stays as it was.
 void loadSettings(Settings& settings, HighScores& highScores, Registry& registry, FrontEnd& frontEnd);
 
-// Writes the settings and the tables, all or nothing. When the registry cannot be opened the user is told; a
-// value that cannot be written is passed over in silence.
+// Writes the settings and the tables, all or nothing. When the registry cannot be opened the user is told;
+// when something cannot be written nobody is, and what was kept before stays.
 void saveSettings(const Settings& settings, const HighScores& highScores, Registry& registry,
                   FrontEnd& frontEnd);
 

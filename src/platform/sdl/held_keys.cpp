@@ -9,22 +9,19 @@ constexpr std::uint32_t longestSilence = 1000;  // milliseconds
 }  // namespace
 
 bool HeldKeys::isMeantFor(std::uint32_t window, std::int32_t key, std::uint32_t time) {
-    Hold& hold = holds_[key];
-    const bool isCarriedOver =
-        hold.window != 0 && hold.window != window && time - hold.lastHeard < longestSilence;
-    hold.lastHeard = time;
-    hold.ignored = isCarriedOver;
-    if (!isCarriedOver)
-        hold.window = window;
-    return !isCarriedOver;
+    ignored_ = key == key_ && window_ != 0 && window_ != window && time - lastHeard_ < longestSilence;
+    if (!ignored_)
+        window_ = window;
+    key_ = key;
+    lastHeard_ = time;
+    return !ignored_;
 }
 
 // When a window loses the focus all its keys are reported as let go, though they may be down. Only the
 // release of a key that was ignored is a real one.
 void HeldKeys::release(std::int32_t key) {
-    const auto hold = holds_.find(key);
-    if (hold != holds_.end() && hold->second.ignored)
-        holds_.erase(hold);
+    if (ignored_ && key == key_)
+        window_ = 0;
 }
 
 }  // namespace quabble

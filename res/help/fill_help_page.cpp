@@ -1,0 +1,174 @@
+// Fills the help page with pictures made of the game's own tiles: fill_help_page SHEET TEMPLATE OUT
+// In the template a picture stands among the attributes of an <img>, where its size and its source go:
+//   {{board 1123/*4*42~1}}  rows of cells from the top down, each the hexadecimal digit of a tile (0 empty,
+//   1-4
+//                           blocks, 5 stone, 6 stone letting go, 7-9 bombs, a-d explosion) or "." for no
+//                           cell;
+//                           "~" before a cell veils it, "*" frames it together with its framed neighbours
+//   {{gauge 40}}            the gauge of a level, 40 per cent full
+
+#include <stb/stb_image.h>
+#include <stb/stb_image_write.h>
+
+#include <algorithm>
+#include <cstdint>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <fstream>
+#include <iterator>
+#include <regex>
+#include <sstream>
+#include <stdexcept>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace {
+
+constexpr int tileSize = 28;
+constexpr std::uint32_t white = 0xffffffff;
+
+void require(bool condition, const std::string& sentence) {
+    if (!condition)
+        throw std::runtime_error(sentence);
+}
+
+struct Picture {
+    template <typename Pixel>
+    Picture(int w, int h, Pixel pixel) : width(w), height(h) {
+        for (int i = 0; i < w * h; ++i)
+            pixels.push_back(pixel(i % w, i / w));
+    }
+    std::uint32_t at(int x, int y) const { return pixels.at(static_cast<std::size_t>(y * width + x)); }
+
+    int width;
+    int height;
+    std::vector<std::uint32_t> pixels;  // four bytes each, red first; 0 is transparent
+};
+
+Picture readSheet(const char* path) {
+    int width = 0;
+    int height = 0;
+    unsigned char* rgba = stbi_load(path, &width, &height, nullptr, 4);
+    require(rgba != nullptr && width == 400 && height == 838,
+            "the sheet cannot be read, or is not 400 x 838");
+    Picture sheet(width, height, [](int, int) { return white; });
+    std::memcpy(sheet.pixels.data(), rgba, 4 * sheet.pixels.size());
+    stbi_image_free(rgba);
+    return sheet;
+}
+
+// A board's rows as written, two characters a cell: the mark or a blank, and the digit.
+std::vector<std::string> rowsOf(const std::string& notation) {
+    static const std::regex cells("([~*]?[0-9a-d.])+(/([~*]?[0-9a-d.])+)*");
+    require(std::regex_match(notation, cells), "is not written as a board is");
+    std::vector<std::string> rows(1);
+    for (const char c : notation) {
+        if (c == '/')
+            rows.emplace_back();
+        else if (c == '~' || c == '*' || rows.back().size() % 2 == 1)
+            rows.back() += c;
+        else
+            rows.back() += {' ', c};
+    }
+    for (const std::string& row : rows)
+        require(row.size() == rows[0].size(), "has rows of different lengths");
+    return rows;
+}
+
+// A frame covers the pixels of its cells that lie within two of any other cell, across a corner too.
+Picture drawBoard(const Picture& sheet, const std::string& notation) {
+    const std::vector<std::string> rows = rowsOf(notation);
+    const int width = tileSize * static_cast<int>(rows[0].size() / 2);
+    const int height = tileSize * static_cast<int>(rows.size());
+    const auto isChosen = [&](int x, int y) {
+        return x >= 0 && y >= 0 && x < width && y < height &&
+               rows[static_cast<std::size_t>(y / tileSize)][static_cast<std::size_t>(x / tileSize * 2)] ==
+                   '*';
+    };
+    return {width, height, [&](int x, int y) -> std::uint32_t {
+                const std::string_view cell(
+                    &rows[static_cast<std::size_t>(y / tileSize)][static_cast<std::size_t>(x / tileSize * 2)],
+                    2);
+                if (cell[1] == '.')
+                    return 0;
+                if (cell[0] == '*' && !(isChosen(x - 2, y - 2) && isChosen(x + 2, y - 2) &&
+                                        isChosen(x - 2, y + 2) && isChosen(x + 2, y + 2)))
+                    return white;
+                const int tile = cell[1] < 'a' ? cell[1] - '0' : cell[1] - 'a' + 10;
+                const auto veil = cell[0] == '~' ? sheet.at(x % tileSize, tileSize + y % tileSize) : white;
+                return veil & sheet.at(tile * tileSize + x % tileSize, y % tileSize);
+            }};
+}
+
+Picture drawGauge(const Picture& sheet, int percentage) {
+    return {30, 241,
+            [&](int x, int y) { return sheet.at(x + (100 * y < 241 * percentage ? 274 : 246), y + 29); }};
+}
+
+std::string base64(const std::string& bytes) {
+    constexpr std::string_view digits = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
+    std::string text;
+    for (std::size_t i = 0; i < bytes.size(); i += 3) {
+        std::uint32_t group = 0;
+        for (std::size_t k = i; k < i + 3; ++k)
+            group = group << 8 | (k < bytes.size() ? static_cast<unsigned char>(bytes[k]) : 0U);
+        for (std::size_t k = 0; k < 4; ++k)
+            text += i + k <= bytes.size() ? digits[group >> (18 - 6 * k) & 63] : '=';
+    }
+    return text;
+}
+
+std::string attributesOf(const Picture& picture) {
+    std::string png;
+    const auto append = [](void* out, void* data, int size) {
+        static_cast<std::string*>(out)->append(static_cast<char*>(data), static_cast<std::size_t>(size));
+    };
+    stbi_write_png_to_func(append, &png, picture.width, picture.height, 4, picture.pixels.data(), 0);
+    std::ostringstream text;
+    text << "width=\"" << picture.width << "\" height=\"" << picture.height
+         << "\" style=\"--w:" << picture.width << ";--h:" << picture.height
+         << "\" src=\"data:image/png;base64," << base64(png) << '"';
+    return text.str();
+}
+
+std::string fill(const std::string& page, const Picture& sheet) {
+    static const std::regex gauge("gauge (\\d\\d?|100)");
+    std::string filled;
+    std::size_t done = 0;
+    for (std::size_t start = 0; (start = page.find("{{", done)) != std::string::npos;) {
+        filled += page.substr(done, start - done);
+        const std::size_t end = std::min({page.find("}}", start), page.find('\n', start), page.size()});
+        const std::string wanted = page.substr(start + 2, end - start - 2);
+        try {
+            require(page.compare(end, 2, "}}") == 0, "does not end on its line");
+            const bool isGauge = std::regex_match(wanted, gauge);
+            require(isGauge || wanted.starts_with("board "), "is neither a board nor a gauge of 0 to 100");
+            filled += attributesOf(isGauge ? drawGauge(sheet, std::stoi(wanted.substr(6)))
+                                           : drawBoard(sheet, wanted.substr(6)));
+        } catch (const std::runtime_error& error) {
+            throw std::runtime_error("the picture {{" + wanted + "}} " + error.what());
+        }
+        done = end + 2;
+    }
+    require(done != 0, "the template asks for no picture");
+    return filled + page.substr(done);
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    try {
+        require(argc == 4, "wanted are three files: SHEET TEMPLATE OUT");
+        const Picture sheet = readSheet(argv[1]);
+        std::ifstream in(argv[2], std::ios::binary);
+        const std::string page = fill({std::istreambuf_iterator<char>(in), {}}, sheet);
+        std::ofstream out(argv[3], std::ios::binary);
+        require(static_cast<bool>((out << page).flush()), std::string("cannot write ") + argv[3]);
+    } catch (const std::runtime_error& error) {
+        std::fprintf(stderr, "fill_help_page: %s\n", error.what());
+        return EXIT_FAILURE;
+    }
+    return EXIT_SUCCESS;
+}

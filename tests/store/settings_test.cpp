@@ -1,0 +1,99 @@
+#include "store_fixture.hpp"
+
+namespace quabble {
+namespace {
+
+class SettingsTest : public StoreFixture {};
+
+std::string hex(std::string_view text) {
+    std::string digits;
+    for (const char character : text) {
+        for (const int nibble : {character >> 4 & 15, character & 15})
+            digits += "0123456789ABCDEF"[nibble];
+    }
+    return digits;
+}
+
+TEST_F(SettingsTest, AFreshStoreHasItsDefaults) {
+    Kept kept;
+    kept.load(registry);
+    EXPECT_TRUE(kept.frontEnd.messages.empty());
+    for (std::int16_t table = 1; table <= 3; ++table) {
+        for (std::size_t place = 0; place < 8; ++place) {
+            EXPECT_EQ(kept.table(table).names[place], "Anononymous");
+            EXPECT_EQ(kept.table(table).scores[place], 0);
+        }
+    }
+    EXPECT_EQ(kept.settings.soundOptions, (std::array<std::int16_t, 7>{1, 1, 1, 1, 1, 1, 1}));
+    EXPECT_EQ(kept.settings.solvingData.scoreTableIndex(), 0);
+}
+
+TEST_F(SettingsTest, EveryByteComesBackAsItWasStored) {
+    Kept().save(registry);
+    set("SOLVINGDATA", "00112233445566778899AABBCCDD");
+    set("NUMWFSF", "DEADBEEF");
+    set("SOUNDOPTIONS", "0000FFFF01000000000000000280");
+    set("2STATS",
+        "0F270000"
+        "FFFFFFFF"
+        "03000000020000000100000000000000FEFFFFFF00000080");
+    set("2STATS5", hex(std::string("Zo\xEB \x80\0", 6)));
+    Kept kept;
+    kept.load(registry);
+    EXPECT_EQ(kept.settings.solvingData.scoreTableIndex(), 0x3322);
+    EXPECT_EQ(kept.settings.soundOptions, (std::array<std::int16_t, 7>{0, -1, 1, 0, 0, 0, -32766}));
+    EXPECT_EQ(kept.table(2).scores[0], 9999);
+    EXPECT_EQ(kept.table(2).scores[7], std::numeric_limits<std::int32_t>::min());
+    EXPECT_EQ(kept.table(2).names[4], "Zo\xEB \x80");
+    kept.settings.solvingData.setScoreTableIndex(3);
+    kept.settings.solvingData.setSplashSeen();
+    kept.save(registry);
+    EXPECT_EQ(stored("SOLVINGDATA"), "00110300010066778899AABBCCDD\n");
+    EXPECT_EQ(stored("NUMWFSF"), "DEADBEEF\n");
+    EXPECT_EQ(stored("SOUNDOPTIONS"), "0000FFFF01000000000000000280\n");
+    EXPECT_EQ(stored("2STATS"), "0F270000FFFFFFFF03000000020000000100000000000000FEFFFFFF00000080\n");
+    EXPECT_EQ(stored("2STATS5"), "5A6FEB208000\n");
+    EXPECT_EQ(sql("SELECT type FROM entries WHERE name IN ('NUMWFSF', '2STATS5') ORDER BY name"), "1\n3\n");
+    EXPECT_EQ(sql("SELECT count(*) FROM entries"), "30\n");
+}
+
+TEST_F(SettingsTest, OneBadValueCostsNoOther) {
+    struct Case {
+        const char* name;
+        std::string entry, value, expectedName;
+        std::int32_t expectedScore;
+    };
+    const std::string of24 = "abcdefghijklmnopqrstuvwx";
+    const Case cases[] = {{"missing", "1STATS3", "", "Anononymous", 0},
+                          {"24 bytes", "1STATS3", hex(of24) + "00", of24, 30},
+                          {"25 bytes", "1STATS3", hex(of24 + "y") + "00", "Anononymous", 0},
+                          {"no bytes at all", "1STATS3", "EMPTY", "", 30},
+                          {"scores of another size", "1STATS", std::string(66, '1'), "third", 0}};
+    for (const Case& c : cases) {
+        std::filesystem::remove_all(file);
+        Kept written;
+        written.table(1) = {{10, 20, 30, 40, 50, 60, 70, 80}, {"a", "b", "third", "d", "e", "f", "g", "h"}};
+        written.save(registry);
+        if (c.value.empty())
+            sql("DELETE FROM entries WHERE name = '" + c.entry + "'");
+        else
+            set(c.entry, c.value == "EMPTY" ? "" : c.value);
+        Kept kept;
+        kept.load(registry);
+        EXPECT_EQ(kept.table(1).names[2], c.expectedName) << c.name;
+        EXPECT_EQ(kept.table(1).scores[2], c.expectedScore) << c.name;
+        EXPECT_EQ(kept.table(1).names[3], "d") << c.name;
+        EXPECT_EQ(kept.table(1).scores[3], c.entry == "1STATS" ? 0 : 40) << c.name;
+    }
+    for (const auto& [value, expected] :
+         {std::pair{"", 0}, {"0500", 5}, {"050000000000000000000000000000", 1}}) {
+        Kept().save(registry);
+        set("SOUNDOPTIONS", value);
+        Kept kept;
+        kept.load(registry);
+        EXPECT_EQ(kept.settings.soundOptions[0], expected) << "sounds of another size: " << value;
+    }
+}
+
+}  // namespace
+}  // namespace quabble

@@ -1,0 +1,69 @@
+#pragma once
+
+#include <gtest/gtest.h>
+#include <sqlite3.h>
+
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <string>
+
+#include "platform/headless/headless_front_end.hpp"
+#include "store/settings_store.hpp"
+
+namespace quabble {
+
+// What a run of the program has in memory of what is kept.
+struct Kept {
+    Settings settings;
+    HighScores highScores;
+    HeadlessFrontEnd frontEnd{""};
+
+    void load(Registry& registry) { loadSettings(settings, highScores, registry, frontEnd); }
+    void save(Registry& registry) { saveSettings(settings, highScores, registry, frontEnd); }
+    bool wasTold() const { return frontEnd.messages == std::vector<std::string>{"Quabble:  Error Failerd"}; }
+    HighScoreTable& table(std::int16_t number) { return highScores.table(number); }
+};
+
+// A folder of its own for each test, and a look into the file that is independent of the registry.
+class StoreFixture : public ::testing::Test {
+ protected:
+    StoreFixture() { std::filesystem::create_directories(folder); }
+    ~StoreFixture() override { std::filesystem::remove_all(folder); }
+
+    // Runs SQL on the file; the first column of what it returns, in hexadecimal, a line a row.
+    std::string sql(const std::string& statements) const {
+        sqlite3* database = nullptr;
+        sqlite3_open(file.c_str(), &database);
+        std::string rows;
+        const auto collect = [](void* all, int, char** row, char**) {
+            *static_cast<std::string*>(all) += std::string(row[0] == nullptr ? "NULL" : row[0]) + "\n";
+            return 0;
+        };
+        char* problem = nullptr;
+        sqlite3_exec(database, statements.c_str(), collect, &rows, &problem);
+        EXPECT_EQ(problem, nullptr) << problem;
+        sqlite3_close(database);
+        return rows;
+    }
+    void set(const std::string& name, const std::string& hex) const {
+        sql("INSERT OR REPLACE INTO entries VALUES ('software\\vorlane\\QUABBLE\\1.0', '" + name +
+            "', 3, x'" + hex + "')");
+    }
+    std::string stored(const std::string& name) const {
+        return sql("SELECT hex(data) FROM entries WHERE name = '" + name + "'");
+    }
+    std::string bytesOf(const std::filesystem::path& path) const {
+        if (!std::filesystem::is_regular_file(path))
+            return {};
+        std::ifstream stream(path, std::ios::binary);
+        return {std::istreambuf_iterator<char>(stream), {}};
+    }
+
+    const std::filesystem::path folder =
+        std::filesystem::temp_directory_path() / ("quabble_store_" + std::to_string(getpid()));
+    const std::filesystem::path file = folder / "data" / "quabble" / "registry.db";
+    Registry registry{file.string()};
+};
+
+}  // namespace quabble
