@@ -59,21 +59,15 @@ Picture readSheet(const char* path) {
     return sheet;
 }
 
-// A board's rows as written, two characters a cell: the mark or a blank, and the digit.
+// The rows of a board, every cell in two characters: its mark or a blank, and its digit.
 std::vector<std::string> rowsOf(const std::string& notation) {
-    static const std::regex cells("([~*]?[0-9a-d.])+(/([~*]?[0-9a-d.])+)*");
-    require(std::regex_match(notation, cells), "is not written as a board is");
-    std::vector<std::string> rows(1);
-    for (const char c : notation) {
-        if (c == '/')
-            rows.emplace_back();
-        else if (c == '~' || c == '*' || rows.back().size() % 2 == 1)
-            rows.back() += c;
-        else
-            rows.back() += {' ', c};
-    }
-    for (const std::string& row : rows)
-        require(row.size() == rows[0].size(), "has rows of different lengths");
+    static const std::regex board("([~*]?[0-9a-d.])+(/([~*]?[0-9a-d.])+)*");
+    static const std::regex beforeUnmarked("(^|[^~*])(?=[0-9a-d.])");
+    require(std::regex_match(notation, board), "is not written as a board is");
+    std::istringstream cells(std::regex_replace(notation, beforeUnmarked, "$1 "));
+    std::vector<std::string> rows;
+    for (std::string row; std::getline(cells, row, '/'); rows.push_back(row))
+        require(rows.empty() || row.size() == rows[0].size(), "has rows of different lengths");
     return rows;
 }
 
@@ -82,22 +76,23 @@ Picture drawBoard(const Picture& sheet, const std::string& notation) {
     const std::vector<std::string> rows = rowsOf(notation);
     const int width = tileSize * static_cast<int>(rows[0].size() / 2);
     const int height = tileSize * static_cast<int>(rows.size());
-    const auto isChosen = [&](int x, int y) {
-        return x >= 0 && y >= 0 && x < width && y < height &&
-               rows[static_cast<std::size_t>(y / tileSize)][static_cast<std::size_t>(x / tileSize * 2)] ==
-                   '*';
+    const auto cellAt = [&](int x, int y) {
+        const bool isInside = x >= 0 && y >= 0 && x < width && y < height;
+        return isInside ? rows[static_cast<std::size_t>(y / tileSize)].substr(
+                              static_cast<std::size_t>(x / tileSize * 2), 2)
+                        : " .";
     };
     return {width, height, [&](int x, int y) -> std::uint32_t {
-                const std::string_view cell(
-                    &rows[static_cast<std::size_t>(y / tileSize)][static_cast<std::size_t>(x / tileSize * 2)],
-                    2);
-                if (cell[1] == '.')
+                const char mark = cellAt(x, y)[0];
+                const char digit = cellAt(x, y)[1];
+                if (digit == '.')
                     return 0;
-                if (cell[0] == '*' && !(isChosen(x - 2, y - 2) && isChosen(x + 2, y - 2) &&
-                                        isChosen(x - 2, y + 2) && isChosen(x + 2, y + 2)))
-                    return white;
-                const int tile = cell[1] < 'a' ? cell[1] - '0' : cell[1] - 'a' + 10;
-                const auto veil = cell[0] == '~' ? sheet.at(x % tileSize, tileSize + y % tileSize) : white;
+                for (int corner = 0; mark == '*' && corner < 4; ++corner) {
+                    if (cellAt(x - 2 + corner % 2 * 4, y - 2 + corner / 2 * 4)[0] != '*')
+                        return white;
+                }
+                const int tile = digit <= '9' ? digit - '0' : digit - 'a' + 10;
+                const auto veil = mark == '~' ? sheet.at(x % tileSize, tileSize + y % tileSize) : white;
                 return veil & sheet.at(tile * tileSize + x % tileSize, y % tileSize);
             }};
 }

@@ -229,6 +229,7 @@ class Robot {
         waitUntil("the best score and its name",
                   [&] { return isSame(desktop_.look(view), {45, 45, 450, 90}, expected.picture, {45, 45}); });
         desktop_.waitForFocus(view);
+        std::this_thread::sleep_for(1s);  // a person reads it; sooner, Enter would count as still held
         desktop_.press(XK_Return);
         waitUntil("the view's end", [this] { return !desktop_.hasWindow("Best Scores - Quabble"); });
     }

@@ -4,7 +4,7 @@ namespace quabble {
 namespace {
 
 // Longer than any usual wait before a key that is held down begins to repeat.
-constexpr std::uint32_t longestSilence = 1000;  // milliseconds
+constexpr std::uint32_t longestSilence = 700;  // milliseconds
 
 }  // namespace
 
