@@ -1,0 +1,141 @@
+#include <gtest/gtest.h>
+
+#include <functional>
+
+#include "machine.hpp"
+#include "store/name_entry.hpp"
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+TEST(NameEntry, AcceptsNineteenCharactersAndNeverNone) {
+    const std::string of20 = "abcdefghijklmnopqrst";
+    for (const auto& [typed, accepted] : {std::pair<std::string, std::string>{"", "-"},
+                                          {"x", "x"},
+                                          {" ", " "},
+                                          {of20.substr(0, 19), of20.substr(0, 19)},
+                                          {of20, of20.substr(0, 19)}})
+        EXPECT_EQ(acceptedName(typed), accepted);
+}
+
+// The program after a Training game of one move, in front of the name entry.
+struct MachineWithAScore : Machine {
+    MachineWithAScore() {
+        app.highScores.table(1) = {{500, 6, 3, 0, 0, 0, 0, 0},
+                                   {"first", "second", "third", "", "", "", "", ""}};
+        start(1, "....111.....");
+        clickCell(5, 16);
+        user.wait(1s);
+        closeDialog();
+    }
+    const std::string& caption() { return user.top().traits.caption; }
+};
+
+TEST(NameEntry, TakesTheNameHoweverItIsClosedAndShowsTheTable) {
+    const std::pair<const char*, std::function<void(ScriptedUser&)>> ways[] = {
+        {"Enter", [](ScriptedUser& user) { user.press(keys::enter); }},
+        {"Esc", [](ScriptedUser& user) { user.press(keys::escape); }},
+        {"the frame", [](ScriptedUser& user) { user.clickCloseButton(); }},
+        {"OK", [](ScriptedUser& user) { user.click(180, 171); }},
+        {"Tab and space", [](ScriptedUser& user) { user.press(keys::tab), user.press(keys::space); }},
+        {"Tab all the way round", [](ScriptedUser& user) {
+             user.press(keys::tab), user.press(keys::tab), user.type("!"), user.press(keys::backspace);
+             user.press(keys::enter);
+         }}};
+    for (const auto& [name, close] : ways) {
+        MachineWithAScore machine;
+        ASSERT_EQ(machine.caption(), "Best Score") << name;
+        machine.user.press('x');  // a key is no text by itself
+        machine.user.type("Zo\u00EB");
+        close(machine.user);
+        EXPECT_EQ(machine.caption(), "Best Scores - Quabble") << name;
+        const HighScoreTable& table = machine.app.highScores.table(1);
+        EXPECT_EQ(table.names[2], "Zo\xEB") << name << ": it ranks below the equal score";
+        EXPECT_TRUE(table.names[1] == "second" && table.names[3] == "third" && table.scores[2] == 6) << name;
+        machine.closeDialog();
+        EXPECT_TRUE(machine.game.mainMenuActive && !machine.hasDialog()) << name;
+    }
+}
+
+TEST(ScoreView, ClearsTheTableThatItShows) {
+    Machine machine;
+    machine.clickMenu(5);
+    const Surface before = machine.user.top().picture;
+    for (const auto& [x, y] : {std::pair{270.F, 420.F}, {405.F, 420.F}, {300.F, 405.F}, {300.F, 435.F}})
+        machine.user.click(x, y);  // the borders of "Clear Scores"
+    EXPECT_TRUE(bytesOf(machine.user.top().picture) == bytesOf(before));
+    machine.user.movePointer(300, 420);
+    machine.user.click(300, 420);
+    EXPECT_NE(machine.user.pixel(270, 420), palette::highlightColour) << "the button is drawn at rest";
+    machine.user.movePointer(301, 420);
+    EXPECT_NE(machine.user.pixel(270, 420), palette::highlightColour) << "and counts as highlighted still";
+    for (std::int16_t table = 1; table <= 3; ++table) {
+        EXPECT_EQ(machine.app.highScores.table(table).names[7], table == 2 ? "Anonoymous" : "Anononymous");
+        EXPECT_EQ(machine.app.highScores.table(table).scores[7], table == 2 ? 0 : 1'000'000'000);
+    }
+    machine.user.click(100, 420);
+    EXPECT_FALSE(machine.hasDialog());
+}
+
+TEST(Splash, ClosesOnItsSecondTickWhateverIsClicked) {
+    HeadlessFrontEnd frontEnd(programFolder.path.string());
+    MessageLoop loop(frontEnd);
+    Registry registry = Registry::inMemory();
+    AppState app(loop, registry, 1);
+    ScriptedUser user(frontEnd, loop);
+    Task<> program = runProgram(app);
+    program.start();
+    EXPECT_TRUE(user.top().traits.borderless && user.top().traits.clientSize == (Size{680, 450}));
+    user.wait(1900ms);
+    for (const auto& [x, y] :
+         {std::pair{350.F, 420.F}, {550.F, 420.F}, {400.F, 400.F}, {400.F, 440.F}, {10.F, 10.F}})
+        user.click(x, y);
+    user.press(keys::enter);
+    EXPECT_TRUE(frontEnd.openedDocuments.empty());
+    user.click(351, 401);
+    EXPECT_EQ(frontEnd.openedDocuments,
+              std::vector<std::string>{"https://quabble.example/ in " + programFolder.path.string()});
+    user.wait(99ms);
+    EXPECT_TRUE(user.top().traits.borderless);
+    user.wait(1ms);
+    EXPECT_EQ(user.top().traits.caption, "Quabble  Ver 1.0");
+    user.click(337, 383);
+    EXPECT_EQ(frontEnd.openedDocuments.back(),
+              programFolder.path.string() + "/QB_HELP.HTM in " + programFolder.path.string());
+}
+
+// However the program ends after it has shown its main window, the settings are kept; before, they are not.
+TEST(Program, KeepsTheScoresWhenItEndsAndNotBefore) {
+    const std::pair<const char*, std::function<void(MachineWithAScore&)>> ends[] = {
+        {"asked to with a dialog open", [](MachineWithAScore& machine) { machine.loop.requestEnd(); }},
+        {"close button",
+         [](MachineWithAScore& machine) {
+             machine.closeDialog();
+             machine.user.clickCloseButton();
+         }},
+        {"Exit", [](MachineWithAScore& machine) {
+             machine.closeDialog();
+             machine.clickMenu(8);
+         }}};
+    for (const auto& [name, end] : ends) {
+        MachineWithAScore machine;
+        machine.user.type("Zoe");
+        machine.user.press(keys::enter);
+        const auto kept = [&] {
+            Settings settings;
+            HighScores scores;
+            loadSettings(settings, scores, machine.registry, machine.frontEnd);
+            return scores.table(1).names[2] + std::to_string(settings.solvingData.scoreTableIndex()) +
+                   std::to_string(std::to_integer<int>(settings.solvingData.bytes[4]));
+        };
+        EXPECT_EQ(kept(), "Anononymous00") << name;
+        end(machine);
+        EXPECT_TRUE(machine.loop.ended()) << name;
+        EXPECT_EQ(kept(), "Zoe11") << name;
+    }
+}
+
+}  // namespace
+}  // namespace quabble
