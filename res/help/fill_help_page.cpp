@@ -10,7 +10,6 @@
 #include <stb/stb_image.h>
 #include <stb/stb_image_write.h>
 
-#include <algorithm>
 #include <cstdint>
 #include <cstdio>
 #include <cstdlib>
@@ -40,7 +39,10 @@ struct Picture {
         for (int i = 0; i < w * h; ++i)
             pixels.push_back(pixel(i % w, i / w));
     }
-    std::uint32_t at(int x, int y) const { return pixels.at(static_cast<std::size_t>(y * width + x)); }
+    std::uint32_t at(int x, int y) const {
+        return pixels.at(static_cast<std::size_t>(y) * static_cast<std::size_t>(width) +
+                         static_cast<std::size_t>(x));
+    }
 
     int width;
     int height;
@@ -53,7 +55,7 @@ Picture readSheet(const char* path) {
     unsigned char* rgba = stbi_load(path, &width, &height, nullptr, 4);
     require(rgba != nullptr && width == 400 && height == 838,
             "the sheet cannot be read, or is not 400 x 838");
-    Picture sheet(width, height, [](int, int) { return white; });
+    Picture sheet(width, height, [](int, int) { return 0U; });
     std::memcpy(sheet.pixels.data(), rgba, 4 * sheet.pixels.size());
     stbi_image_free(rgba);
     return sheet;
@@ -77,10 +79,10 @@ Picture drawBoard(const Picture& sheet, const std::string& notation) {
     const int width = tileSize * static_cast<int>(rows[0].size() / 2);
     const int height = tileSize * static_cast<int>(rows.size());
     const auto cellAt = [&](int x, int y) {
-        const bool isInside = x >= 0 && y >= 0 && x < width && y < height;
-        return isInside ? rows[static_cast<std::size_t>(y / tileSize)].substr(
-                              static_cast<std::size_t>(x / tileSize * 2), 2)
-                        : " .";
+        if (x < 0 || y < 0 || x >= width || y >= height)
+            return std::string_view(" .");
+        const std::string_view row = rows[static_cast<std::size_t>(y / tileSize)];
+        return row.substr(2 * static_cast<std::size_t>(x / tileSize), 2);
     };
     return {width, height, [&](int x, int y) -> std::uint32_t {
                 const char mark = cellAt(x, y)[0];
@@ -129,26 +131,26 @@ std::string attributesOf(const Picture& picture) {
 }
 
 std::string fill(const std::string& page, const Picture& sheet) {
+    static const std::regex placeholder("\\{\\{([^}\n]*)(\\}\\})?");
     static const std::regex gauge("gauge (\\d\\d?|100)");
     std::string filled;
-    std::size_t done = 0;
-    for (std::size_t start = 0; (start = page.find("{{", done)) != std::string::npos;) {
-        filled += page.substr(done, start - done);
-        const std::size_t end = std::min({page.find("}}", start), page.find('\n', start), page.size()});
-        const std::string wanted = page.substr(start + 2, end - start - 2);
+    std::string rest;
+    for (std::sregex_iterator match(page.begin(), page.end(), placeholder), end; match != end; ++match) {
+        const std::string wanted = match->str(1);
         try {
-            require(page.compare(end, 2, "}}") == 0, "does not end on its line");
+            require((*match)[2].matched, "does not end on its line");
             const bool isGauge = std::regex_match(wanted, gauge);
             require(isGauge || wanted.starts_with("board "), "is neither a board nor a gauge of 0 to 100");
+            filled += match->prefix().str();
             filled += attributesOf(isGauge ? drawGauge(sheet, std::stoi(wanted.substr(6)))
                                            : drawBoard(sheet, wanted.substr(6)));
         } catch (const std::runtime_error& error) {
-            throw std::runtime_error("the picture {{" + wanted + "}} " + error.what());
+            throw std::runtime_error("the picture " + match->str() + " " + error.what());
         }
-        done = end + 2;
+        rest = match->suffix();
     }
-    require(done != 0, "the template asks for no picture");
-    return filled + page.substr(done);
+    require(!filled.empty(), "the template cannot be read, or asks for no picture");
+    return filled + rest;
 }
 
 }  // namespace
