@@ -120,19 +120,16 @@ void SdlFrontEnd::run(MessageLoop& loop) {
 
 // Blocks until something has happened or the program's wait is over, then posts all that has happened.
 void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
-    SDL_Event event;
-    if (SDL_PollEvent(&event) == 0) {
+    if (SDL_PollEvent(nullptr) == 0)
         desktopWait_.sleep(windows_.empty() ? nullptr : windows_.begin()->second->sdl(), timeLeft(loop));
-        if (SDL_PollEvent(&event) == 0)
-            return;
-    }
-    do {
+    SDL_Event event;
+    while (SDL_PollEvent(&event) != 0) {
         if (event.type == SDL_QUIT) {
             loop.requestEnd();
             return;
         }
         take(event, loop);
-    } while (SDL_PollEvent(&event) != 0);
+    }
 }
 
 std::optional<milliseconds> SdlFrontEnd::timeLeft(const MessageLoop& loop) {
