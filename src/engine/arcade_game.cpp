@@ -38,14 +38,14 @@ Task<> Game::initArcadeLevel() {
         co_await gameOver();
         co_return;
     }
-    const ArcadeLevelSpec& spec = levelTable_[state_.stats.level];
+    const ArcadeLevelSpec& entry = levelTable_[state_.stats.level];
     state_.rowsEntered = 0;
     if (state_.gameMode == GameMode::Timed)
-        stage_.setBlockTimerInterval(std::chrono::milliseconds(spec.tickInterval()));
+        stage_.setBlockTimerInterval(std::chrono::milliseconds(entry.tickInterval()));
     stage_.switchBlockTimer(state_.gameMode == GameMode::Timed);
     setUpBoard(stage_.layOutArcade());
     state_.tickCount = 0;
-    fillFrom(static_cast<std::int16_t>(state_.grid.gridRows() - spec.startRows + 1));
+    fillFrom(static_cast<std::int16_t>(state_.grid.gridRows() - entry.startRows + 1));
     stage_.drawPlayPanel();
     stage_.drawBoard();
     stage_.drawPreviewRow(state_.tickCount);

@@ -26,7 +26,7 @@ class LevelTable {
  public:
     LevelTable();
 
-    // The spec of a level, 1 to 10.
+    // The record of a level, 1 to 10.
     const ArcadeLevelSpec& operator[](std::int16_t level) const;
 
  private:

@@ -64,12 +64,12 @@ TEST(LevelTable, HoldsTheTenLevels) {
     const LevelTable table;
     std::int16_t number = 0;
     for (const Level& level : levels) {
-        const ArcadeLevelSpec& spec = table[++number];
-        EXPECT_EQ(spec.startRows, level.startRows) << number;
-        EXPECT_EQ(spec.colourCount, level.colourCount) << number;
-        EXPECT_EQ(spec.rowPeriod, level.rowPeriod) << number;
-        EXPECT_EQ(spec.rowsToComplete, level.rowsToComplete) << number;
-        EXPECT_EQ(spec.tickInterval(), level.tickInterval) << number;
+        const ArcadeLevelSpec& entry = table[++number];
+        EXPECT_EQ(entry.startRows, level.startRows) << number;
+        EXPECT_EQ(entry.colourCount, level.colourCount) << number;
+        EXPECT_EQ(entry.rowPeriod, level.rowPeriod) << number;
+        EXPECT_EQ(entry.rowsToComplete, level.rowsToComplete) << number;
+        EXPECT_EQ(entry.tickInterval(), level.tickInterval) << number;
     }
 }
 
