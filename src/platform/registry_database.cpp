@@ -66,7 +66,8 @@ std::unique_ptr<RegistryDatabase> RegistryDatabase::connect(const std::string& p
 
 std::unique_ptr<RegistryDatabase> RegistryDatabase::open(const std::string& path) {
     auto database = connect(path);
-    if (!database || !database->begin())
+    const bool isWritable = database && sqlite3_db_readonly(database->connection_.get(), "main") == 0;
+    if (!isWritable || !database->begin())
         return nullptr;
     if (!database->isOrBecomesRegistry()) {
         database->abandon();
@@ -101,13 +102,14 @@ void RegistryDatabase::abandon() {
 bool RegistryDatabase::isOrBecomesRegistry() {
     RegistryStatement check = prepare("PRAGMA integrity_check(1)");
     RegistryStatement version = prepare("PRAGMA user_version");
-    RegistryStatement tables = prepare("SELECT count(*) FROM sqlite_schema");
+    RegistryStatement tables =
+        prepare("SELECT count(*), total(name IN ('keys', 'entries')) FROM sqlite_schema");
     const bool isSound = check.nextRow() && check.bytes(0) == "ok" && version.nextRow() && tables.nextRow();
     if (!isSound)
         return false;
     if (version.number(0) == 0 && tables.number(0) == 0)
         return execute(schema);
-    return version.number(0) == schemaVersion;
+    return version.number(0) == schemaVersion && tables.number(1) == 2;
 }
 
 bool RegistryDatabase::execute(const char* sql) {

@@ -1,4 +1,3 @@
-#include <pwd.h>
 #include <sys/stat.h>
 
 #include <array>
@@ -62,24 +61,17 @@ TEST_F(RegistryTest, IsTheUsersAloneAndOneTransaction) {
 }
 
 TEST(UserRegistry, LiesInTheUsersDataFolder) {
-    const std::string account = getpwuid(getuid())->pw_dir;
-    struct Case {
-        const char *home, *dataHome;
-        std::string expected;
-    };
-    const Case cases[] = {
-        {"/home/x", nullptr, "/home/x/.local/share"},  {"/home/x", "", "/home/x/.local/share"},
-        {"/home/x", "data", "/home/x/.local/share"},   {"/home/x", "/data", "/data"},
-        {nullptr, nullptr, account + "/.local/share"}, {"", "", account + "/.local/share"},
-        {"x", "./data", account + "/.local/share"}};
-    const auto put = [](const char* name, const char* value) {
-        value == nullptr ? unsetenv(name) : setenv(name, value, 1);
-    };
-    for (const Case& c : cases) {
-        put("HOME", c.home);
-        put("XDG_DATA_HOME", c.dataHome);
-        EXPECT_EQ(userRegistryPath("q"), c.expected + "/q/registry.db");
+    const std::string home = std::getenv("HOME") == nullptr ? "" : std::getenv("HOME");
+    setenv("HOME", "/home/x", 1);
+    const std::pair<const char*, std::string> cases[] = {{nullptr, "/home/x/.local/share/q/registry.db"},
+                                                         {"", "/home/x/.local/share/q/registry.db"},
+                                                         {"data", "/home/x/.local/share/q/registry.db"},
+                                                         {"/data", "/data/q/registry.db"}};
+    for (const auto& [dataHome, expected] : cases) {
+        dataHome == nullptr ? unsetenv("XDG_DATA_HOME") : setenv("XDG_DATA_HOME", dataHome, 1);
+        EXPECT_EQ(userRegistryPath("q"), expected);
     }
+    setenv("HOME", home.c_str(), 1);
 }
 
 // Whatever lies where the registry should be is the user's: it is left as it is, and the game plays on.
@@ -96,13 +88,7 @@ TEST_F(RegistryTest, LeavesWhatIsNoRegistryAlone) {
                  << sound.substr(0, 4096) + std::string(sound.size() - 4096, 'x');
          }},
         {"from a later version", [&] { sql("PRAGMA user_version = 2"); }},
-        {"someone else's with our tables", [&] { sql("PRAGMA user_version = 0"); }},
-        {"someone else's",
-         [&] {
-             std::filesystem::remove(file), sql("CREATE TABLE notes (text); INSERT INTO notes VALUES (1)");
-         }},
-        {"someone else's of our version",
-         [&] { std::filesystem::remove(file), sql("CREATE TABLE notes (text); PRAGMA user_version = 1"); }},
+        {"someone else's", [&] { sql("PRAGMA user_version = 0"); }},
         {"a folder", [&] { std::filesystem::remove(file), std::filesystem::create_directory(file); }}};
     for (const auto& [name, damage] : cases) {
         std::filesystem::remove_all(file);
@@ -118,44 +104,6 @@ TEST_F(RegistryTest, LeavesWhatIsNoRegistryAlone) {
         saved.save(registry);
         EXPECT_TRUE(saved.wasTold()) << name;
         EXPECT_EQ(bytesOf(file), before) << name;
-    }
-}
-
-// Root may do everything, so somebody else tries.
-TEST_F(RegistryTest, LeavesWhatItMayNotReadOrWriteAlone) {
-    struct Case {
-        const char* name;
-        mode_t folderMode, fileMode;  // no file when 0
-        bool toldOnLoad, toldOnSave;
-        const char* loaded;
-    };
-    const Case cases[] = {{"unreadable", 0777, 0200, true, true, ""},
-                          {"read-only", 0777, 0444, true, true, ""},
-                          {"in a read-only folder", 0555, 0666, true, true, ""},
-                          {"missing from a read-only folder", 0555, 0, true, true, ""}};
-    for (const Case& c : cases) {
-        Kept first;
-        first.table(1).names[0] = "first";
-        first.save(registry);
-        c.fileMode == 0 ? unlink(file.c_str()) : chmod(file.c_str(), c.fileMode);
-        chmod(folder.c_str(), 0777), chmod(file.parent_path().parent_path().c_str(), 0755);
-        chmod(file.parent_path().c_str(), c.folderMode);
-        const std::string before = bytesOf(file);
-        const int wrong = inChild([&] {
-            if (getuid() == 0 && (setgid(65534) != 0 || setuid(65534) != 0))
-                return -1;
-            Kept loaded;
-            loaded.load(registry);
-            Kept saved;
-            saved.save(registry);
-            return (loaded.wasTold() != c.toldOnLoad ? 1 : 0) | (saved.wasTold() != c.toldOnSave ? 2 : 0) |
-                   (loaded.table(1).names[0] != c.loaded ? 4 : 0);
-        });
-        EXPECT_EQ(wrong, 0) << c.name;
-        chmod(file.parent_path().c_str(), 0700);
-        EXPECT_EQ(bytesOf(file), before) << c.name;
-        EXPECT_EQ(std::filesystem::exists(file), c.fileMode != 0) << c.name;
-        std::filesystem::remove_all(file.parent_path());
     }
 }
 

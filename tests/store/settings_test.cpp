@@ -17,7 +17,6 @@ std::string hex(std::string_view text) {
 TEST_F(SettingsTest, AFreshStoreHasItsDefaults) {
     Kept kept;
     kept.load(registry);
-    EXPECT_EQ(sql("SELECT class FROM keys WHERE path LIKE '%1.0'"), "USERDATA\n");
     EXPECT_TRUE(kept.frontEnd.messages.empty());
     for (std::int16_t table = 1; table <= 3; ++table) {
         for (std::size_t place = 0; place < 8; ++place) {
@@ -94,27 +93,6 @@ TEST_F(SettingsTest, OneBadValueCostsNoOther) {
         kept.load(registry);
         EXPECT_EQ(kept.settings.soundOptions[0], expected) << "sounds of another size: " << value;
     }
-}
-
-// A file as the first version of the program left it on its users' disks.
-TEST_F(SettingsTest, AStoreOfTheFirstVersionLoads) {
-    std::filesystem::create_directories(file.parent_path());
-    sql("CREATE TABLE keys (path TEXT NOT NULL PRIMARY KEY COLLATE NOCASE, class TEXT NOT NULL);"
-        "CREATE TABLE entries (key TEXT NOT NULL COLLATE NOCASE REFERENCES keys (path), name TEXT NOT NULL "
-        "COLLATE NOCASE, type INTEGER NOT NULL, data BLOB NOT NULL, PRIMARY KEY (key, name));"
-        "INSERT INTO keys VALUES ('Software', ''), ('Software\\Vorlane', ''), ('Software\\Vorlane\\Quabble', "
-        "''),"
-        "('Software\\Vorlane\\Quabble\\1.0', 'USERDATA'); PRAGMA user_version = 1;");
-    set("SOLVINGDATA", "0000020001000000000000000000");
-    set("3STATS", std::string("39300000") + std::string(56, '0'));
-    set("3STATS1", hex("Zoe") + "00");
-    Kept kept;
-    kept.load(registry);
-    EXPECT_TRUE(kept.frontEnd.messages.empty());
-    EXPECT_EQ(kept.settings.solvingData.scoreTableIndex(), 2);
-    EXPECT_EQ(kept.table(3).names[0] + std::to_string(kept.table(3).scores[0]), "Zoe12345");
-    kept.save(registry);
-    EXPECT_EQ(sql("SELECT group_concat(class, '/') FROM keys"), "///USERDATA\n");
 }
 
 }  // namespace
