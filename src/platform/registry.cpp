@@ -54,10 +54,16 @@ Registry::Registry(Registry&& other) noexcept = default;
 Registry& Registry::operator=(Registry&& other) noexcept = default;
 
 std::optional<RegistryKey> Registry::openKey(std::string_view name) {
-    if (!keeper_)
+    if (!keeper_) {
         prepareFile(path_);
+        // A change needs a journal beside the file.
+        isGivenUp_ |= ::access(std::filesystem::path(path_).parent_path().c_str(), W_OK) != 0;
+    }
+    if (isGivenUp_)
+        return std::nullopt;
     std::shared_ptr<RegistryDatabase> database = RegistryDatabase::open(path_);
-    if (!database)
+    isGivenUp_ = !database;
+    if (isGivenUp_)
         return std::nullopt;
     return RegistryKey(std::move(database), std::string(name));
 }

@@ -47,7 +47,8 @@ class RegistryKey {
 // The user's registry: a tree of keys with values, kept in one database file. From the opening of a key of
 // the root until it and all keys opened through it are closed runs one transaction: others see all of it or
 // nothing, and so does the next run after a crash. A file that is not a registry, is damaged, or was written
-// by a later version is not touched.
+// by a later version is not touched; once it could not be opened it stays closed, so that nobody overwrites
+// what he never read.
 class Registry {
  public:
     // The file is made, readable by the user alone, when a key is first opened; so are the folders above it.
@@ -68,6 +69,7 @@ class Registry {
 
  private:
     std::string path_;
+    bool isGivenUp_ = false;
     std::unique_ptr<RegistryDatabase> keeper_;  // holds what is in memory only
 };
 

@@ -75,8 +75,12 @@ TEST(ScoreView, ClearsTheTableThatItShows) {
         EXPECT_EQ(machine.app.highScores.table(table).names[7], table == 2 ? "Anonoymous" : "Anononymous");
         EXPECT_EQ(machine.app.highScores.table(table).scores[7], table == 2 ? 0 : 1'000'000'000);
     }
+    machine.user.movePointer(10, 10);
+    const Surface cleared = machine.user.top().picture;
     machine.user.click(100, 420);
     EXPECT_FALSE(machine.hasDialog());
+    machine.clickMenu(5);
+    EXPECT_TRUE(bytesOf(machine.user.top().picture) == bytesOf(cleared)) << "all of it was painted anew";
 }
 
 TEST(Splash, ClosesOnItsSecondTickWhateverIsClicked) {
@@ -135,6 +139,18 @@ TEST(Program, KeepsTheScoresWhenItEndsAndNotBefore) {
         EXPECT_TRUE(machine.loop.ended()) << name;
         EXPECT_EQ(kept(), "Zoe11") << name;
     }
+}
+
+TEST(Program, ShowsInItsNextRunWhatTheLastOneKept) {
+    MachineWithAScore machine;
+    machine.user.type("Zo\u00EB \u20AC");
+    machine.user.press(keys::enter);
+    const Surface seen = machine.user.top().picture;
+    machine.loop.requestEnd();
+    Machine next(std::move(machine.registry));
+    EXPECT_EQ(next.game.scoreTableIndex, 1);
+    next.clickMenu(4);
+    EXPECT_TRUE(bytesOf(next.user.top().picture) == bytesOf(seen));
 }
 
 }  // namespace

@@ -61,18 +61,22 @@ inline const ProgramFolder programFolder;
 struct Machine {
     HeadlessFrontEnd frontEnd{programFolder.path.string()};
     MessageLoop loop{frontEnd};
-    Registry registry = Registry::inMemory();
+    Registry registry;
     AppState app;
     ScriptedUser user{frontEnd, loop};
     GameState& game = app.game;
     Task<> program = runProgram(app);
 
-    explicit Machine(std::uint64_t seed = 1) : app(loop, registry, seed) {
+    explicit Machine(std::uint64_t seed = 1) : Machine(Registry::inMemory(), seed) {
+        for (std::int16_t table = 1; table <= highScoreTables; ++table)
+            app.highScores.table(table).scores.fill(1'000'000'000);
+    }
+    // With the high scores that an earlier run has left.
+    explicit Machine(Registry kept, std::uint64_t seed = 1)
+        : registry(std::move(kept)), app(loop, registry, seed) {
         frontEnd.connect(loop);
         program.start();
         user.wait(std::chrono::minutes(1));  // until the main menu is there
-        for (std::int16_t table = 1; table <= highScoreTables; ++table)
-            app.highScores.table(table).scores.fill(1'000'000'000);
     }
 
     void pointAtMenu(int button) { user.movePointer(337, static_cast<float>(52.5 * button + 15)); }

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdlib>
+
 #include "platform/headless/headless_front_end.hpp"
 
 namespace quabble {
@@ -37,6 +39,15 @@ TEST(TextBox, EditsALine) {
         {{"ab", SelectAll, Copy, End, Paste}, "abab", 4, 4, "ab"},
         {{"abc", {Left, true}, Cut, Home, Paste}, "cab", 1, 1, "c"},
         {{"ab", Copy, Cut}, "ab", 2, 2, ""},
+        {{"ab", {Left, true}, Copy, End, Copy, Cut}, "ab", 2, 2, "b"},
+        {{"\u20AC\u201A\u0192\u201E\u2026\u2020\u2021\u02C6\u2030\u0160\u2039\u0152\u017D\u2018\u2019\u201C"
+          "\u201D\u2022\u2013\u2014\u02DC\u2122\u0161\u203A\u0153\u017E\u0178\u00A0\u00FF"},
+         "\x80\x82\x83\x84\x85\x86\x87\x88\x89\x8A\x8B\x8C\x8E\x91\x92\x93\x94\x95\x96\x97\x98\x99\x9A\x9B"
+         "\x9C"
+         "\x9E\x9F\xA0\xFF",
+         29,
+         29,
+         ""},
         {{"Zo\u00EB \u20AC \u0141 \U0001F600"}, "Zo\xEB \x80 ? ?", 9, 9, ""},
         {{"\xC3", "a\xFF\xE2\x82", "\xC0\x80\xED"},
          "?a????"
@@ -73,6 +84,11 @@ int caretColumn(const TextBox& box) {
     return -1;
 }
 
+void press(TextBox& box, int x, bool withShift) {
+    Task<> pressed = box.mouseDown({x, 14}, withShift);
+    pressed.start();
+}
+
 TEST(TextBox, KeepsTheCaretOfALongTextInSightAndFollowsTheMouse) {
     HeadlessFrontEnd frontEnd("");
     TextBox box(frontEnd);
@@ -86,15 +102,42 @@ TEST(TextBox, KeepsTheCaretOfALongTextInSightAndFollowsTheMouse) {
         EXPECT_GE(caretColumn(box), 4) << i;
     }
     EXPECT_EQ(caretColumn(box), 4);
-    Task<> press = box.mouseDown({50, 14}, false);
-    press.start();
-    EXPECT_NEAR(caretColumn(box), 50, 4);
+    box.edit(End, false);
+    for (int x = 93; x > 6; --x) {
+        press(box, x, false);
+        EXPECT_LE(std::abs(caretColumn(box) - x), 5) << "the nearest gap, " << x;
+    }
+    press(box, 50, false);
     const std::size_t from = box.caret();
     box.mouseDrag({500, 14});
     EXPECT_EQ(box.anchor(), from);
     EXPECT_GT(box.caret(), from + 4) << "to the end of what is seen, and beyond";
     box.textInput("!");
     EXPECT_EQ(box.caret(), from + 1);
+    box.mouseDrag({-500, 14});
+    EXPECT_EQ(box.caret(), 0U);
+    EXPECT_EQ(caretColumn(box), 4);
+    box.edit(End, false);
+    while (box.text().size() > 3)
+        box.edit(Backspace, false);
+    EXPECT_NEAR(caretColumn(box), 29, 3) << "what fits is seen from its start";
+}
+
+TEST(TextBox, MarksWhatIsSelected) {
+    HeadlessFrontEnd frontEnd("");
+    TextBox box(frontEnd);
+    box.font = {Typeface::Sans, 11, false};
+    box.area = Rect::ofSize(0, 0, 100, 28);
+    box.textInput("oooooooo");
+    press(box, 60, false);
+    const int end = caretColumn(box);
+    press(box, 30, true);
+    const int start = caretColumn(box);
+    Surface seen(100, 28);
+    box.paint(seen, false);
+    for (int x = 6; x < 94; ++x)
+        EXPECT_EQ(seen.at(x, 6) != seen.at(95, 6), x >= start && x < end) << x;
+    EXPECT_TRUE(start > 20 && start < 40 && end > 50 && end < 70);
 }
 
 }  // namespace

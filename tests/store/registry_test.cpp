@@ -1,3 +1,4 @@
+#include <pwd.h>
 #include <sys/stat.h>
 
 #include <array>
@@ -61,17 +62,24 @@ TEST_F(RegistryTest, IsTheUsersAloneAndOneTransaction) {
 }
 
 TEST(UserRegistry, LiesInTheUsersDataFolder) {
-    const std::string home = std::getenv("HOME") == nullptr ? "" : std::getenv("HOME");
-    setenv("HOME", "/home/x", 1);
-    const std::pair<const char*, std::string> cases[] = {{nullptr, "/home/x/.local/share/q/registry.db"},
-                                                         {"", "/home/x/.local/share/q/registry.db"},
-                                                         {"data", "/home/x/.local/share/q/registry.db"},
-                                                         {"/data", "/data/q/registry.db"}};
-    for (const auto& [dataHome, expected] : cases) {
-        dataHome == nullptr ? unsetenv("XDG_DATA_HOME") : setenv("XDG_DATA_HOME", dataHome, 1);
-        EXPECT_EQ(userRegistryPath("q"), expected);
+    const std::string account = getpwuid(getuid())->pw_dir;
+    struct Case {
+        const char *home, *dataHome;
+        std::string expected;
+    };
+    const Case cases[] = {
+        {"/home/x", nullptr, "/home/x/.local/share"},  {"/home/x", "", "/home/x/.local/share"},
+        {"/home/x", "data", "/home/x/.local/share"},   {"/home/x", "/data", "/data"},
+        {nullptr, nullptr, account + "/.local/share"}, {"", "", account + "/.local/share"},
+        {"x", "./data", account + "/.local/share"}};
+    const auto put = [](const char* name, const char* value) {
+        value == nullptr ? unsetenv(name) : setenv(name, value, 1);
+    };
+    for (const Case& c : cases) {
+        put("HOME", c.home);
+        put("XDG_DATA_HOME", c.dataHome);
+        EXPECT_EQ(userRegistryPath("q"), c.expected + "/q/registry.db");
     }
-    setenv("HOME", home.c_str(), 1);
 }
 
 // Whatever lies where the registry should be is the user's: it is left as it is, and the game plays on.
@@ -88,22 +96,85 @@ TEST_F(RegistryTest, LeavesWhatIsNoRegistryAlone) {
                  << sound.substr(0, 4096) + std::string(sound.size() - 4096, 'x');
          }},
         {"from a later version", [&] { sql("PRAGMA user_version = 2"); }},
-        {"someone else's", [&] { sql("PRAGMA user_version = 0"); }},
+        {"someone else's with our tables", [&] { sql("PRAGMA user_version = 0"); }},
+        {"someone else's",
+         [&] {
+             std::filesystem::remove(file), sql("CREATE TABLE notes (text); INSERT INTO notes VALUES (1)");
+         }},
+        {"someone else's of our version",
+         [&] { std::filesystem::remove(file), sql("CREATE TABLE notes (text); PRAGMA user_version = 1"); }},
         {"a folder", [&] { std::filesystem::remove(file), std::filesystem::create_directory(file); }}};
     for (const auto& [name, damage] : cases) {
         std::filesystem::remove_all(file);
         std::ofstream(file, std::ios::binary) << sound;
         damage();
         const std::string before = bytesOf(file);
+        Registry fresh(file.string());
         Kept loaded;
-        loaded.load(registry);
+        loaded.load(fresh);
         EXPECT_TRUE(loaded.wasTold()) << name;
         EXPECT_EQ(loaded.table(1).names[0] + loaded.table(3).names[7], "") << name;
         EXPECT_EQ(loaded.settings.soundOptions[0], 0) << name;
         Kept saved;
-        saved.save(registry);
+        saved.save(fresh);
         EXPECT_TRUE(saved.wasTold()) << name;
         EXPECT_EQ(bytesOf(file), before) << name;
+    }
+}
+
+TEST_F(RegistryTest, DoesNotOverwriteWhatCouldNotBeRead) {
+    Kept first;
+    first.table(2).scores[0] = 700;
+    first.save(registry);
+    std::filesystem::rename(file, folder / "aside");
+    std::filesystem::create_directory(file);
+    Registry fresh(file.string());
+    Kept blank;
+    blank.load(fresh);
+    std::filesystem::remove(file);
+    std::filesystem::rename(folder / "aside", file);
+    blank.save(fresh);
+    EXPECT_EQ(blank.frontEnd.messages.size(), 2U) << "the user was told each time";
+    Kept next;
+    next.load(registry);
+    EXPECT_EQ(next.table(2).scores[0], 700);
+}
+
+// Root may do everything, so somebody else tries.
+TEST_F(RegistryTest, LeavesWhatItMayNotReadOrWriteAlone) {
+    struct Case {
+        const char* name;
+        mode_t folderMode, fileMode;  // no file when 0
+    };
+    const Case cases[] = {{"unreadable", 0777, 0200},
+                          {"read-only", 0777, 0444},
+                          {"in a read-only folder", 0555, 0666},
+                          {"missing from a read-only folder", 0555, 0}};
+    for (const Case& c : cases) {
+        Kept first;
+        first.table(1).names[0] = "first";
+        first.save(registry);
+        if (c.fileMode == 0)
+            std::filesystem::remove(file);
+        const std::string before = bytesOf(file);
+        chmod(file.c_str(), c.fileMode);
+        chmod(folder.c_str(), 0777), chmod(file.parent_path().parent_path().c_str(), 0755);
+        chmod(file.parent_path().c_str(), c.folderMode);
+        const int wrong = inChild([&] {
+            if (getuid() == 0 && (setgid(65534) != 0 || setuid(65534) != 0))
+                return -1;
+            Kept loaded;
+            loaded.load(registry);
+            Kept saved;
+            saved.save(registry);
+            return (loaded.wasTold() ? 0 : 1) | (saved.wasTold() ? 0 : 2) |
+                   (loaded.table(1).names[0].empty() ? 0 : 4);
+        });
+        EXPECT_EQ(wrong, 0) << c.name;
+        chmod(file.parent_path().c_str(), 0700), chmod(file.c_str(), 0600);
+        EXPECT_EQ(bytesOf(file), before) << c.name;
+        EXPECT_EQ(std::filesystem::exists(file), c.fileMode != 0) << c.name;
+        std::filesystem::remove_all(file.parent_path());
     }
 }
 

@@ -17,6 +17,7 @@ std::string hex(std::string_view text) {
 TEST_F(SettingsTest, AFreshStoreHasItsDefaults) {
     Kept kept;
     kept.load(registry);
+    EXPECT_EQ(sql("SELECT class FROM keys WHERE path LIKE '%1.0'"), "USERDATA\n");
     EXPECT_TRUE(kept.frontEnd.messages.empty());
     for (std::int16_t table = 1; table <= 3; ++table) {
         for (std::size_t place = 0; place < 8; ++place) {
@@ -93,6 +94,27 @@ TEST_F(SettingsTest, OneBadValueCostsNoOther) {
         kept.load(registry);
         EXPECT_EQ(kept.settings.soundOptions[0], expected) << "sounds of another size: " << value;
     }
+}
+
+// The file was written by another program, as the first version leaves it on its users' disks.
+TEST_F(SettingsTest, AStoreOfTheFirstVersionLoadsAndIsKeptUp) {
+    std::filesystem::create_directories(file.parent_path());
+    std::filesystem::copy_file(QUABBLE_GOLDEN_STORE, file);
+    Kept kept;
+    kept.load(registry);
+    EXPECT_TRUE(kept.frontEnd.messages.empty());
+    EXPECT_EQ(kept.settings.solvingData.scoreTableIndex(), 2);
+    EXPECT_EQ(kept.settings.soundOptions, (std::array<std::int16_t, 7>{1, 1, 0, 1, 1, 1, 1}));
+    EXPECT_EQ(kept.table(3).names[7],
+              "Zo\xEB \x80"
+              "38");
+    EXPECT_EQ(kept.table(3).scores[7], 30035);
+    kept.table(3).scores[7] = 30036;
+    kept.save(registry);
+    EXPECT_EQ(stored("3STATS").substr(56), "54750000\n");
+    EXPECT_EQ(stored("NUMWFSF"), "DEADBEEF\n");
+    EXPECT_EQ(sql("SELECT count(*) FROM entries"), "30\n");
+    EXPECT_EQ(sql("SELECT group_concat(class, '/') FROM keys"), "///USERDATA\n");
 }
 
 }  // namespace

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 #include <sqlite3.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 #include <filesystem>
 #include <fstream>
@@ -58,6 +60,17 @@ class StoreFixture : public ::testing::Test {
             return {};
         std::ifstream stream(path, std::ios::binary);
         return {std::istreambuf_iterator<char>(stream), {}};
+    }
+
+    // Runs work in a process of its own; what it returned, -1 when it crashed.
+    template <typename Work>
+    static int inChild(Work work) {
+        const pid_t child = fork();
+        if (child == 0)
+            _exit(work());
+        int status = 0;
+        waitpid(child, &status, 0);
+        return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
     }
 
     const std::filesystem::path folder =
