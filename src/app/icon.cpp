@@ -3,15 +3,21 @@
 #include <cstddef>
 
 extern "C" {
-extern const unsigned char quabbleIcon[];  // icon_pixels.S
+extern const unsigned char quabbleIcons[];  // icon_pixels.S
 }
 
 namespace quabble {
 
-Icon applicationIcon() {
-    constexpr Size size{64, 64};
-    constexpr std::size_t bytes = std::size_t{4} * size.width * size.height;
-    return {size, {quabbleIcon, bytes}};
+std::array<Icon, 5> applicationIcons() {
+    std::array<Icon, 5> icons;
+    constexpr std::array<std::int32_t, 5> widths{16, 32, 48, 64, 128};
+    std::size_t start = 0;
+    for (std::size_t i = 0; i < icons.size(); ++i) {
+        const std::size_t bytes = std::size_t{4} * widths[i] * widths[i];
+        icons[i] = {{widths[i], widths[i]}, {quabbleIcons + start, bytes}};
+        start += bytes;
+    }
+    return icons;
 }
 
 }  // namespace quabble

@@ -17,7 +17,7 @@ std::string withSeparator(std::string folder) {
 }
 
 Task<> Main(AppState& app) {
-    app.loop.frontEnd().setIcon(applicationIcon());
+    app.loop.frontEnd().setIcons(applicationIcons());
     app.programFolder = withSeparator(app.loop.frontEnd().executableFolder());
     app.load();
     app.pictures = loadGraphics(app.programFolder);

@@ -48,8 +48,8 @@ class FrontEnd {
     virtual void closeWindow(WindowId window) = 0;
     // Asks for the window to be minimised; an event reports when it is.
     virtual void minimiseWindow(WindowId /*window*/) {}
-    // The icon of all windows that are made from now on.
-    virtual void setIcon(const Icon& /*icon*/) {}
+    // The icon, in several sizes, of all windows that are made from now on.
+    virtual void setIcons(std::span<const Icon> /*icons*/) {}
     virtual Size screenSize() { return {1024, 768}; }
 
     // Shows a message with an OK button and waits for it.

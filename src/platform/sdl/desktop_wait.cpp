@@ -1,24 +1,11 @@
 #include "platform/sdl/desktop_wait.hpp"
 
 #include <SDL2/SDL.h>
-#include <SDL2/SDL_syswm.h>
 #include <poll.h>
 
+#include "platform/sdl/x11_window.hpp"
+
 namespace quabble {
-namespace {
-
-// The connection to the X server; nothing on other desktops.
-std::optional<int> xConnection(SDL_Window* window) {
-    SDL_SysWMinfo info{};
-    SDL_VERSION(&info.version);
-    if (window == nullptr || SDL_GetWindowWMInfo(window, &info) == SDL_FALSE ||
-        info.subsystem != SDL_SYSWM_X11)
-        return std::nullopt;
-    return ConnectionNumber(info.info.x11.display);
-}
-
-}  // namespace
-
 DesktopWait::DesktopWait() {
     sigset_t ends;
     sigemptyset(&ends);
@@ -34,8 +21,8 @@ DesktopWait::~DesktopWait() {
 // On X11 this is not left to SDL: its own wait wakes itself by an event to one of the windows over a second
 // connection, which kills the program when the window has been closed before the server gets to it.
 void DesktopWait::sleep(SDL_Window* window, std::optional<milliseconds> longest) const {
-    if (const auto connection = xConnection(window)) {
-        pollfd waiting{*connection, POLLIN, 0};
+    if (const auto x11 = X11Window::of(window)) {
+        pollfd waiting{x11->connection(), POLLIN, 0};
         const auto time = longest.value_or(milliseconds::zero());
         const timespec end{time.count() / 1000, time.count() % 1000 * 1'000'000};
         ppoll(&waiting, 1, longest ? &end : nullptr, &before_);

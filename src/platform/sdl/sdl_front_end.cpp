@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <csignal>
-#include <cstring>
 #include <filesystem>
 
 #include "platform/sdl/detached_process.hpp"
@@ -19,72 +18,6 @@ extern "C" void passOnHangUp(int) {
 }
 
 }  // namespace
-
-// A window of the desktop and the picture it shows.
-class SdlFrontEnd::DesktopWindow {
- public:
-    DesktopWindow(const NativeWindow& traits, Point position, const DesktopWindow* owner) {
-        const bool isDialog = owner != nullptr;
-        SDL_SetHint(SDL_HINT_X11_WINDOW_TYPE, isDialog ? "_NET_WM_WINDOW_TYPE_DIALOG" : "");
-        const Uint32 flags = SDL_WINDOW_HIDDEN | (isDialog ? Uint32{SDL_WINDOW_SKIP_TASKBAR} : 0U) |
-                             (traits.borderless ? Uint32{SDL_WINDOW_BORDERLESS} : 0U);
-        window_.reset(SDL_CreateWindow(traits.caption.c_str(), position.x, position.y,
-                                       traits.clientSize.width, traits.clientSize.height, flags));
-        if (isDialog && window_)
-            SDL_SetWindowModalFor(sdl(), owner->sdl());
-    }
-
-    SDL_Window* sdl() const { return window_.get(); }
-
-    // The first picture brings the window onto the screen.
-    void show(const Surface& picture) {
-        picture_ = picture;
-        if (window_ && (SDL_GetWindowFlags(sdl()) & SDL_WINDOW_HIDDEN) != 0)
-            SDL_ShowWindow(sdl());
-        showAgain();
-    }
-
-    // A window that was uncovered, restored or resized gets its picture again.
-    void showAgain() {
-        SDL_Surface* screen = window_ ? SDL_GetWindowSurface(sdl()) : nullptr;
-        if (screen == nullptr)
-            return;
-        const bool direct = screen->format->BytesPerPixel == 4 && screen->format->Rmask == 0xFF0000 &&
-                            screen->format->Gmask == 0xFF00 && screen->format->Bmask == 0xFF;
-        if (direct)
-            copyTo(*screen);
-        else
-            convertTo(*screen);
-        SDL_UpdateWindowSurface(sdl());
-    }
-
- private:
-    void copyTo(SDL_Surface& screen) const {
-        const auto width = static_cast<std::size_t>(std::min(screen.w, picture_.width()));
-        for (std::int32_t y = 0; y < std::min(screen.h, picture_.height()); ++y) {
-            auto* line = static_cast<std::byte*>(screen.pixels) + std::ptrdiff_t{y} * screen.pitch;
-            std::memcpy(line, picture_.row(y).data(), width * sizeof(std::uint32_t));
-        }
-    }
-
-    void convertTo(SDL_Surface& screen) {
-        if (picture_.isEmpty())
-            return;
-        SDL_Surface* source = SDL_CreateRGBSurfaceWithFormatFrom(
-            picture_.row(0).data(), picture_.width(), picture_.height(), 32,
-            picture_.width() * static_cast<int>(sizeof(std::uint32_t)), SDL_PIXELFORMAT_RGB888);
-        if (source == nullptr)
-            return;
-        SDL_BlitSurface(source, nullptr, &screen, nullptr);
-        SDL_FreeSurface(source);
-    }
-
-    struct Destroy {
-        void operator()(SDL_Window* window) const { SDL_DestroyWindow(window); }
-    };
-    std::unique_ptr<SDL_Window, Destroy> window_;
-    Surface picture_;
-};
 
 std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
     // A window surface drawn by the processor opens at once; by way of OpenGL it takes many times as long.
@@ -106,7 +39,6 @@ std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
 
 SdlFrontEnd::~SdlFrontEnd() {
     windows_.clear();
-    icon_.reset();
     SDL_Quit();
 }
 
@@ -141,15 +73,22 @@ std::optional<milliseconds> SdlFrontEnd::timeLeft(const MessageLoop& loop) {
 
 void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
     const WindowId window = idOf(windowOf(event));
+    DesktopWindow* shown = find(window);
     if (event.type == SDL_WINDOWEVENT && (event.window.event == SDL_WINDOWEVENT_EXPOSED ||
                                           event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED)) {
-        if (DesktopWindow* shown = find(window))
+        if (shown != nullptr)
             shown->showAgain();
     }
     auto input = translate(event);
     if (!isMeantForItsWindow(event) || !input)
         return;
     input->window = window;
+    if (shown != nullptr) {
+        const Point place =
+            shown->programPixel({static_cast<std::int32_t>(input->x), static_cast<std::int32_t>(input->y)});
+        input->x = static_cast<float>(place.x);
+        input->y = static_cast<float>(place.y);
+    }
     loop.post(*input);
 }
 
@@ -171,24 +110,7 @@ bool SdlFrontEnd::isMeantForItsWindow(const SDL_Event& event) {
 }
 
 void SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
-    auto made = std::make_unique<DesktopWindow>(traits, placeOf(traits), find(traits.owner));
-    if (icon_ && made->sdl() != nullptr)
-        SDL_SetWindowIcon(made->sdl(), icon_.get());
-    windows_[window] = std::move(made);
-}
-
-Point SdlFrontEnd::placeOf(const NativeWindow& traits) {
-    if (traits.position)
-        return *traits.position;
-    const DesktopWindow* owner = find(traits.owner);
-    if (owner == nullptr)
-        return {static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED),
-                static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED)};
-    Rect area;
-    SDL_GetWindowPosition(owner->sdl(), &area.left, &area.top);
-    SDL_GetWindowSize(owner->sdl(), &area.right, &area.bottom);
-    return {area.left + (area.right - traits.clientSize.width) / 2,
-            area.top + (area.bottom - traits.clientSize.height) / 2};
+    windows_[window] = std::make_unique<DesktopWindow>(traits, find(traits.owner), icons_);
 }
 
 void SdlFrontEnd::showPixels(WindowId window, const Surface& picture) {
@@ -205,11 +127,8 @@ void SdlFrontEnd::minimiseWindow(WindowId window) {
         SDL_MinimizeWindow(shown->sdl());
 }
 
-void SdlFrontEnd::setIcon(const Icon& icon) {
-    SDL_Surface* borrowed =
-        SDL_CreateRGBSurfaceWithFormatFrom(const_cast<unsigned char*>(icon.rgba.data()), icon.size.width,
-                                           icon.size.height, 32, icon.size.width * 4, SDL_PIXELFORMAT_RGBA32);
-    icon_.reset(borrowed);
+void SdlFrontEnd::setIcons(std::span<const Icon> icons) {
+    icons_.assign(icons.begin(), icons.end());
 }
 
 void SdlFrontEnd::showMessageBox(const std::string& title, const std::string& text) {
@@ -220,13 +139,15 @@ void SdlFrontEnd::openDocument(const std::string& document, const std::string& f
     startDetached({"xdg-open", document}, folder);
 }
 
-void SdlFrontEnd::setTextInput(WindowId, std::optional<Rect> area) {
-    if (!area) {
+void SdlFrontEnd::setTextInput(WindowId window, std::optional<Rect> area) {
+    const DesktopWindow* shown = find(window);
+    if (shown == nullptr || !area) {
         SDL_StopTextInput();
         return;
     }
-    SDL_Rect place{area->left, area->top, area->width(), area->height()};
-    SDL_SetTextInputRect(&place);
+    const Rect place = shown->placeOf(*area);
+    const SDL_Rect sdlPlace{place.left, place.top, place.width(), place.height()};
+    SDL_SetTextInputRect(&sdlPlace);
     SDL_StartTextInput();
 }
 
@@ -241,10 +162,6 @@ void SdlFrontEnd::setClipboardText(const std::string& text) {
     SDL_SetClipboardText(text.c_str());
 }
 
-void SdlFrontEnd::FreeSurface::operator()(SDL_Surface* surface) const {
-    SDL_FreeSurface(surface);
-}
-
 Size SdlFrontEnd::screenSize() {
     SDL_Rect bounds{};
     SDL_GetDisplayBounds(0, &bounds);
@@ -256,15 +173,14 @@ std::string SdlFrontEnd::executableFolder() {
     return std::filesystem::read_symlink("/proc/self/exe", unknown).parent_path().string();
 }
 
-SdlFrontEnd::DesktopWindow* SdlFrontEnd::find(WindowId window) {
+DesktopWindow* SdlFrontEnd::find(WindowId window) {
     const auto found = windows_.find(window);
     return found == windows_.end() ? nullptr : found->second.get();
 }
 
 WindowId SdlFrontEnd::idOf(std::uint32_t sdlWindow) const {
-    const auto found = std::ranges::find_if(windows_, [&](const auto& window) {
-        return window.second->sdl() != nullptr && SDL_GetWindowID(window.second->sdl()) == sdlWindow;
-    });
+    const auto found = std::ranges::find_if(
+        windows_, [&](const auto& window) { return sdlWindow != 0 && window.second->sdlId() == sdlWindow; });
     return found == windows_.end() ? WindowId::none : found->first;
 }
 

@@ -4,13 +4,14 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "platform/front_end.hpp"
 #include "platform/message_loop.hpp"
 #include "platform/sdl/desktop_wait.hpp"
+#include "platform/sdl/desktop_window.hpp"
 #include "platform/sdl/held_keys.hpp"
 
-struct SDL_Surface;
 union SDL_Event;
 
 namespace quabble {
@@ -30,7 +31,7 @@ class SdlFrontEnd final : public FrontEnd {
     void showPixels(WindowId window, const Surface& picture) override;
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
-    void setIcon(const Icon& icon) override;
+    void setIcons(std::span<const Icon> icons) override;
     void showMessageBox(const std::string& title, const std::string& text) override;
     void openDocument(const std::string& document, const std::string& folder) override;
     void setTextInput(WindowId window, std::optional<Rect> area) override;
@@ -40,22 +41,16 @@ class SdlFrontEnd final : public FrontEnd {
     std::string executableFolder() override;
 
  private:
-    class DesktopWindow;
-    struct FreeSurface {
-        void operator()(SDL_Surface* surface) const;
-    };
-
     SdlFrontEnd() = default;
     DesktopWindow* find(WindowId window);
     WindowId idOf(std::uint32_t sdlWindow) const;
-    Point placeOf(const NativeWindow& traits);
     void waitForEvents(MessageLoop& loop);
     std::optional<milliseconds> timeLeft(const MessageLoop& loop);
     void take(const SDL_Event& event, MessageLoop& loop);
     bool isMeantForItsWindow(const SDL_Event& event);
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
-    std::unique_ptr<SDL_Surface, FreeSurface> icon_;
+    std::vector<Icon> icons_;
     DesktopWait desktopWait_;
     HeldKeys heldKeys_;
     bool textIsMeant_ = true;  // what the key that was pressed last types

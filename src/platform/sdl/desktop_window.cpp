@@ -1,0 +1,139 @@
+#include "platform/sdl/desktop_window.hpp"
+
+#include <SDL2/SDL.h>
+
+#include <algorithm>
+#include <vector>
+
+#include "base/round_half_even.hpp"
+#include "platform/sdl/x11_window.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr double plainDotsPerInch = 96;
+constexpr Size nominalFrame{6, 29};  // what a window manager puts around a window, in all
+
+Rect workArea() {
+    SDL_Rect area{};
+    SDL_GetDisplayUsableBounds(0, &area);
+    return Rect::ofSize(area.x, area.y, area.w, area.h);
+}
+
+}  // namespace
+
+DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* owner,
+                             std::span<const Icon> icons)
+    : clientSize_(traits.clientSize) {
+    const bool isDialog = owner != nullptr;
+    SDL_SetHint(SDL_HINT_X11_WINDOW_TYPE, isDialog ? "_NET_WM_WINDOW_TYPE_DIALOG" : "");
+    const Uint32 flags = SDL_WINDOW_HIDDEN | SDL_WINDOW_ALLOW_HIGHDPI |
+                         (isDialog ? Uint32{SDL_WINDOW_SKIP_TASKBAR} : 0U) |
+                         (traits.borderless ? Uint32{SDL_WINDOW_BORDERLESS} : 0U);
+    window_.reset(
+        SDL_CreateWindow(traits.caption.c_str(), 0, 0, clientSize_.width, clientSize_.height, flags));
+    if (!window_)
+        return;
+    scale_ = isDialog ? owner->scale_ : scaleOf(traits);
+    const Size size = scaled(clientSize_, scale_);
+    SDL_SetWindowSize(sdl(), size.width, size.height);
+    const Point position = positionOf(traits, owner);
+    SDL_SetWindowPosition(sdl(), position.x, position.y);
+    if (isDialog)
+        SDL_SetWindowModalFor(sdl(), owner->sdl());
+    if (const auto x11 = X11Window::of(sdl())) {
+        x11->setIcons(icons);
+        if (isDialog)
+            x11->haveOnlyCloseButton();
+    }
+}
+
+// Where the desktop scales windows by itself, on Wayland, it says so by the size of the window's surface.
+double DesktopWindow::scaleOf(const NativeWindow& traits) const {
+    const auto x11 = X11Window::of(sdl());
+    if (!x11)
+        return 1;
+    const Rect area = workArea();
+    const Size frame = traits.borderless ? Size{} : nominalFrame;
+    return scaleFor(x11->dotsPerInch().value_or(plainDotsPerInch), clientSize_,
+                    {area.width() - frame.width, area.height() - frame.height});
+}
+
+// A place that the program asks for is meant for an unscaled window: the middle of its upper edge stays.
+Point DesktopWindow::positionOf(const NativeWindow& traits, const DesktopWindow* owner) const {
+    const Size own = size();
+    if (traits.position) {
+        const std::int32_t left = traits.position->x + (clientSize_.width - own.width) / 2;
+        return {std::max(left, workArea().left), traits.position->y};
+    }
+    if (owner == nullptr) {
+        return {static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED),
+                static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED)};
+    }
+    Point corner;
+    SDL_GetWindowPosition(owner->sdl(), &corner.x, &corner.y);
+    const Size around = owner->size();
+    return {corner.x + (around.width - own.width) / 2, corner.y + (around.height - own.height) / 2};
+}
+
+std::uint32_t DesktopWindow::sdlId() const {
+    return window_ ? SDL_GetWindowID(sdl()) : 0;
+}
+
+void DesktopWindow::show(const Surface& picture) {
+    picture_ = picture;
+    if (window_ && (SDL_GetWindowFlags(sdl()) & SDL_WINDOW_HIDDEN) != 0)
+        SDL_ShowWindow(sdl());
+    showAgain();
+}
+
+void DesktopWindow::showAgain() {
+    SDL_Surface* screen = window_ && !picture_.isEmpty() ? SDL_GetWindowSurface(sdl()) : nullptr;
+    if (screen == nullptr)
+        return;
+    fill(*screen);
+    SDL_UpdateWindowSurface(sdl());
+}
+
+void DesktopWindow::fill(SDL_Surface& screen) {
+    const Size shown{screen.w, screen.h};
+    if (magnifier_.shownSize() != shown)
+        magnifier_ = Magnifier({picture_.width(), picture_.height()}, shown);
+    const bool isOfOurFormat = screen.format->BytesPerPixel == 4 && screen.format->Rmask == 0xFF0000 &&
+                               screen.format->Gmask == 0xFF00 && screen.format->Bmask == 0xFF;
+    if (isOfOurFormat) {
+        magnifier_.show(picture_, static_cast<std::uint32_t*>(screen.pixels), screen.pitch);
+        return;
+    }
+    Surface whole(shown.width, shown.height);
+    const int stride = shown.width * static_cast<int>(sizeof(std::uint32_t));
+    magnifier_.show(picture_, whole.row(0).data(), stride);
+    SDL_Surface* source = SDL_CreateRGBSurfaceWithFormatFrom(whole.row(0).data(), shown.width, shown.height,
+                                                             32, stride, SDL_PIXELFORMAT_RGB888);
+    SDL_BlitSurface(source, nullptr, &screen, nullptr);
+    SDL_FreeSurface(source);
+}
+
+Point DesktopWindow::programPixel(Point place) const {
+    return pixelSeenAt(place, size(), clientSize_);
+}
+
+Rect DesktopWindow::placeOf(const Rect& programPixels) const {
+    const Size own = size();
+    const auto across = [&](std::int32_t x) { return x * own.width / clientSize_.width; };
+    const auto down = [&](std::int32_t y) { return y * own.height / clientSize_.height; };
+    return {across(programPixels.left), down(programPixels.top), across(programPixels.right),
+            down(programPixels.bottom)};
+}
+
+Size DesktopWindow::size() const {
+    Size size = clientSize_;
+    SDL_GetWindowSize(sdl(), &size.width, &size.height);
+    return size;
+}
+
+void DesktopWindow::Destroy::operator()(SDL_Window* window) const {
+    SDL_DestroyWindow(window);
+}
+
+}  // namespace quabble

@@ -1,0 +1,49 @@
+#pragma once
+
+#include <cstdint>
+#include <memory>
+#include <span>
+
+#include "platform/front_end.hpp"
+#include "platform/scaling.hpp"
+
+struct SDL_Window;
+struct SDL_Surface;
+
+namespace quabble {
+
+// A window of the desktop and the picture it shows, as large as the desktop's scale asks for. A dialog takes
+// over its owner's scale.
+class DesktopWindow {
+ public:
+    DesktopWindow(const NativeWindow& traits, const DesktopWindow* owner, std::span<const Icon> icons);
+
+    SDL_Window* sdl() const { return window_.get(); }
+    std::uint32_t sdlId() const;  // 0 when the desktop had no window to give
+
+    // Shows a picture of the window's client size. The first one brings the window onto the screen.
+    void show(const Surface& picture);
+    // A window that was uncovered, restored or resized gets its picture again.
+    void showAgain();
+
+    // From the desktop's coordinates within the window to the program's pixels, and back.
+    Point programPixel(Point place) const;
+    Rect placeOf(const Rect& programPixels) const;
+
+ private:
+    Size size() const;  // in the desktop's coordinates
+    double scaleOf(const NativeWindow& traits) const;
+    Point positionOf(const NativeWindow& traits, const DesktopWindow* owner) const;
+    void fill(SDL_Surface& screen);
+
+    struct Destroy {
+        void operator()(SDL_Window* window) const;
+    };
+    std::unique_ptr<SDL_Window, Destroy> window_;
+    Size clientSize_;
+    double scale_ = 1;
+    Surface picture_;
+    Magnifier magnifier_;
+};
+
+}  // namespace quabble

@@ -1,0 +1,34 @@
+#pragma once
+
+#include <optional>
+#include <span>
+
+#include "platform/front_end.hpp"
+
+struct SDL_Window;
+struct _XDisplay;
+
+namespace quabble {
+
+// A window as the X server knows it, for what SDL has no words for. What it asks of a window manager that
+// does not know it has no effect.
+class X11Window {
+ public:
+    // Nothing on other desktops.
+    static std::optional<X11Window> of(SDL_Window* window);
+
+    int connection() const;  // the descriptor of the connection to the server
+    // The user's dots per inch of texts (the X resource Xft.dpi), if any are set.
+    std::optional<double> dotsPerInch() const;
+    // Takes the buttons to minimise and maximise off a dialog's frame: its owner could not bring it back.
+    void haveOnlyCloseButton() const;
+    void setIcons(std::span<const Icon> icons) const;
+
+ private:
+    X11Window(_XDisplay* display, unsigned long window) : display_(display), window_(window) {}
+
+    _XDisplay* display_;
+    unsigned long window_;
+};
+
+}  // namespace quabble
