@@ -60,7 +60,7 @@ class FrontEnd {
     virtual void openDocument(const std::string& /*document*/, const std::string& /*folder*/) {}
 
     // While a window has an area where text is typed, typed text comes as events, and what an input method
-    // shows lies at the area. Without one it does not.
+    // shows lies at the area. Without one it does not. A window that does not exist has none.
     virtual void setTextInput(WindowId /*window*/, std::optional<Rect> /*area*/) {}
 
     // The text that the desktop's programs exchange, UTF-8.

@@ -1,6 +1,7 @@
 #include "platform/text_box.hpp"
 
 #include <algorithm>
+#include <ranges>
 
 #include "platform/windows_1252.hpp"
 
@@ -117,10 +118,10 @@ std::int32_t TextBox::widthUpTo(std::size_t characters) const {
 // The gap between characters nearest to a point.
 std::size_t TextBox::characterAt(Point at) const {
     const std::int32_t x = at.x - inner().left + scroll_;
-    std::size_t character = 0;
-    while (character < text_.size() && (widthUpTo(character) + widthUpTo(character + 1)) / 2 < x)
-        ++character;
-    return character;
+    const auto characters = std::views::iota(std::size_t{0}, text_.size());
+    return *std::ranges::partition_point(characters, [&](std::size_t character) {
+        return (widthUpTo(character) + widthUpTo(character + 1)) / 2 < x;
+    });
 }
 
 std::size_t TextBox::wordLeft() const {

@@ -34,6 +34,7 @@ void Window::show() {
     Form_Load();
     traits_.owner = owner_ == nullptr ? WindowId::none : owner_->id_;
     loop_.frontEnd().createWindow(id_, traits_);
+    tellWhereTextIsTyped();
     refresh();
 }
 
@@ -42,6 +43,7 @@ void Window::unload() {
         return;
     shown_ = false;
     Form_Unload();
+    loop_.frontEnd().setTextInput(id_, std::nullopt);
     loop_.frontEnd().closeWindow(id_);
 }
 
@@ -78,8 +80,12 @@ Task<> Window::Form_KeyPress(std::int16_t) {
 
 void Window::setFocus(Control* control) {
     focus_ = control;
-    const bool takesText = control != nullptr && control->takesText();
-    loop_.frontEnd().setTextInput(id_, takesText ? std::optional(control->area) : std::nullopt);
+    tellWhereTextIsTyped();
+}
+
+void Window::tellWhereTextIsTyped() {
+    const bool takesText = focus_ != nullptr && focus_->takesText();
+    loop_.frontEnd().setTextInput(id_, takesText ? std::optional(focus_->area) : std::nullopt);
 }
 
 Task<> Window::handle(InputEvent event) {

@@ -78,6 +78,7 @@ class Window {
     void dragControl(Point at);
     void editText(const InputEvent& event);
     void focusNext();
+    void tellWhereTextIsTyped();
 
     MessageLoop& loop_;
     Window* owner_;

@@ -3,7 +3,7 @@
 namespace quabble {
 
 void HeadlessFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
-    windows_[window] = {traits, Surface(traits.clientSize.width, traits.clientSize.height), 0, false};
+    windows_[window] = {traits, Surface(traits.clientSize.width, traits.clientSize.height), 0, false, false};
 }
 
 void HeadlessFrontEnd::showPixels(WindowId window, const Surface& picture) {
@@ -21,6 +21,11 @@ void HeadlessFrontEnd::closeWindow(WindowId window) {
 void HeadlessFrontEnd::minimiseWindow(WindowId window) {
     windows_.at(window).minimised = true;
     loop_->post({.window = window, .kind = EventKind::Minimised});
+}
+
+void HeadlessFrontEnd::setTextInput(WindowId window, std::optional<Rect> area) {
+    if (const auto shown = windows_.find(window); shown != windows_.end())
+        shown->second.takesText = area.has_value();
 }
 
 void HeadlessFrontEnd::restoreWindow(WindowId window) {

@@ -18,6 +18,7 @@ class HeadlessFrontEnd final : public FrontEnd {
         Surface picture;  // as shown last
         int timesShown = 0;
         bool minimised = false;
+        bool takesText = false;
     };
 
     explicit HeadlessFrontEnd(std::string folder) : executableFolder_(std::move(folder)) {}
@@ -36,6 +37,7 @@ class HeadlessFrontEnd final : public FrontEnd {
     void openDocument(const std::string& document, const std::string& folder) override {
         openedDocuments.push_back(document + " in " + folder);
     }
+    void setTextInput(WindowId window, std::optional<Rect> area) override;
     std::string clipboardText() override { return clipboard; }
     void setClipboardText(const std::string& text) override { clipboard = text; }
     std::string executableFolder() override { return executableFolder_; }

@@ -10,6 +10,8 @@ void ScriptedUser::press(std::int16_t key) {
 }
 
 void ScriptedUser::type(const std::string& utf8) {
+    if (!top().takesText)
+        return;
     loop_.post({.window = topWindow(), .kind = EventKind::TextInput, .text = utf8});
     loop_.wake();
 }

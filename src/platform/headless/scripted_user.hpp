@@ -18,7 +18,7 @@ class ScriptedUser {
     void click(float x, float y) { act(EventKind::MouseDown, x, y); }
     void movePointer(float x, float y) { act(EventKind::MouseMove, x, y); }
     void press(std::int16_t key);
-    void type(const std::string& utf8);
+    void type(const std::string& utf8);  // in vain where no text is asked for
     void edit(EditCommand command, bool extends = false);
     void clickCloseButton() { act(EventKind::CloseButton); }
     void minimise() { frontEnd_.minimiseWindow(topWindow()), loop_.wake(); }

@@ -82,8 +82,11 @@ std::uint32_t DesktopWindow::sdlId() const {
 
 void DesktopWindow::show(const Surface& picture) {
     picture_ = picture;
-    if (window_ && (SDL_GetWindowFlags(sdl()) & SDL_WINDOW_HIDDEN) != 0)
+    if (window_ && (SDL_GetWindowFlags(sdl()) & SDL_WINDOW_HIDDEN) != 0) {
+        // On Wayland SDL makes the window anew when it first asks for a surface; that is not to be seen.
+        SDL_GetWindowSurface(sdl());
         SDL_ShowWindow(sdl());
+    }
     showAgain();
 }
 

@@ -10,26 +10,55 @@ namespace {
 // The character that a key yields; nothing for modifiers, arrows, function keys and the like, and for keys
 // pressed together with a modifier that makes them a command of the desktop.
 std::optional<std::int16_t> characterOf(const SDL_Keysym& keysym) {
+    if ((keysym.mod & (KMOD_CTRL | KMOD_LALT | KMOD_GUI)) != 0)
+        return std::nullopt;
     switch (keysym.sym) {
         case SDLK_KP_ENTER:
             return keys::enter;
+        case SDLK_KP_DIVIDE:
+            return '/';
+        case SDLK_KP_MULTIPLY:
+            return '*';
+        case SDLK_KP_MINUS:
+            return '-';
+        case SDLK_KP_PLUS:
+            return '+';
         case SDLK_DELETE:
             return std::nullopt;
         default:
             break;
     }
-    const bool isCommand = (keysym.mod & (KMOD_CTRL | KMOD_LALT | KMOD_GUI)) != 0;
-    const bool isKeypadCharacter = keysym.sym >= SDLK_KP_DIVIDE && keysym.sym <= SDLK_KP_PERIOD;
+    const bool isKeypadDigit = keysym.sym >= SDLK_KP_1 && keysym.sym <= SDLK_KP_PERIOD;
+    if (isKeypadDigit && (keysym.mod & KMOD_NUM) != 0)
+        return "1234567890."[keysym.sym - SDLK_KP_1];
     const bool hasCharacter = keysym.sym > 0 && keysym.sym <= std::numeric_limits<std::int16_t>::max();
-    if (isCommand || !(hasCharacter || isKeypadCharacter))
-        return std::nullopt;
-    return static_cast<std::int16_t>(hasCharacter ? keysym.sym : ' ');
+    return hasCharacter ? std::optional(static_cast<std::int16_t>(keysym.sym)) : std::nullopt;
+}
+
+// The key that a key of the keypad stands for as long as the keypad types no digits.
+SDL_Keycode withoutKeypad(const SDL_Keysym& keysym) {
+    if ((keysym.mod & KMOD_NUM) != 0)
+        return keysym.sym;
+    switch (keysym.sym) {
+        case SDLK_KP_4:
+            return SDLK_LEFT;
+        case SDLK_KP_6:
+            return SDLK_RIGHT;
+        case SDLK_KP_7:
+            return SDLK_HOME;
+        case SDLK_KP_1:
+            return SDLK_END;
+        case SDLK_KP_PERIOD:
+            return SDLK_DELETE;
+        default:
+            return keysym.sym;
+    }
 }
 
 // What a key asks of a text being edited, with Ctrl held or not.
 std::optional<EditCommand> commandOf(const SDL_Keysym& keysym) {
     const bool ctrl = (keysym.mod & KMOD_CTRL) != 0;
-    switch (keysym.sym) {
+    switch (withoutKeypad(keysym)) {
         case SDLK_LEFT:
             return ctrl ? EditCommand::WordLeft : EditCommand::Left;
         case SDLK_RIGHT:

@@ -4,10 +4,12 @@
 
 #include <algorithm>
 #include <csignal>
+#include <cstring>
 #include <filesystem>
 
 #include "platform/sdl/detached_process.hpp"
 #include "platform/sdl/sdl_events.hpp"
+#include "platform/sdl/x11_window.hpp"
 
 namespace quabble {
 namespace {
@@ -20,17 +22,25 @@ extern "C" void passOnHangUp(int) {
 }  // namespace
 
 std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
-    // A window surface drawn by the processor opens at once; by way of OpenGL it takes many times as long.
-    SDL_SetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0");
     SDL_SetHint(SDL_HINT_QUIT_ON_LAST_WINDOW_CLOSE, "0");
     SDL_SetHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
     SDL_SetHint(SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1");
     SDL_SetHint(SDL_HINT_APP_NAME, "quabble");
+    // Where Wayland leaves frames to the programs, SDL 2.26 with libdecor dies of events for windows that are
+    // closed.
+    SDL_version version{};
+    SDL_GetVersion(&version);
+    if (version.major == 2 && version.minor < 28)
+        SDL_SetHint(SDL_HINT_VIDEO_WAYLAND_ALLOW_LIBDECOR, "0");
     SDL_SetHint("SDL_VIDEO_X11_WMCLASS", "quabble");
     if (SDL_Init(SDL_INIT_VIDEO) != 0) {
         problem = SDL_GetError();
         return nullptr;
     }
+    // On X11 a window surface drawn by the processor opens at once; by way of OpenGL it takes many times as
+    // long. Wayland has no other way.
+    if (std::strcmp(SDL_GetCurrentVideoDriver(), "x11") == 0)
+        SDL_SetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0");
     SDL_EnableScreenSaver();
     SDL_StopTextInput();
     std::signal(SIGHUP, passOnHangUp);
@@ -44,10 +54,17 @@ SdlFrontEnd::~SdlFrontEnd() {
 
 void SdlFrontEnd::run(MessageLoop& loop) {
     loop.wake();
+    // The program then ends as it would when asked to, but has no windows any more to close.
+    X11Window::whenServerGoes([this, &loop] {
+        static decltype(windows_) abandoned;
+        abandoned.swap(windows_);
+        loop.requestEnd();
+    });
     while (!loop.ended()) {
         waitForEvents(loop);
         loop.wake();
     }
+    X11Window::whenServerGoes([] {});
 }
 
 // Blocks until something has happened or the program's wait is over, then posts all that has happened.
@@ -101,6 +118,7 @@ bool SdlFrontEnd::isMeantForItsWindow(const SDL_Event& event) {
             return textIsMeant_;
         case SDL_KEYUP:
             heldKeys_.release(event.key.keysym.scancode);
+            textIsMeant_ = true;
             return true;
         case SDL_TEXTINPUT:
             return textIsMeant_;
@@ -141,7 +159,9 @@ void SdlFrontEnd::openDocument(const std::string& document, const std::string& f
 
 void SdlFrontEnd::setTextInput(WindowId window, std::optional<Rect> area) {
     const DesktopWindow* shown = find(window);
-    if (shown == nullptr || !area) {
+    if (shown == nullptr)
+        return;
+    if (!area) {
         SDL_StopTextInput();
         return;
     }

@@ -6,8 +6,11 @@
 #include <X11/Xresource.h>
 
 #include <charconv>
+#include <cstdio>
+#include <cstdlib>
 #include <cstring>
 #include <memory>
+#include <utility>
 #include <vector>
 
 namespace quabble {
@@ -43,6 +46,17 @@ std::optional<X11Window> X11Window::of(SDL_Window* window) {
         info.subsystem != SDL_SYSWM_X11)
         return std::nullopt;
     return X11Window(info.info.x11.display, info.info.x11.window);
+}
+
+void X11Window::whenServerGoes(std::function<void()> callback) {
+    static std::function<void()> kept;
+    kept = std::move(callback);
+    XSetIOErrorHandler([](Display*) {
+        kept();
+        std::fputs("The display that Quabble was shown on has gone.\n", stderr);
+        std::_Exit(EXIT_FAILURE);
+        return 0;
+    });
 }
 
 int X11Window::connection() const {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <optional>
 #include <span>
 
@@ -16,6 +17,10 @@ class X11Window {
  public:
     // Nothing on other desktops.
     static std::optional<X11Window> of(SDL_Window* window);
+
+    // Calls this when the connection to the server is lost, and then ends the process with a failure. The
+    // callback must ask nothing more of the server.
+    static void whenServerGoes(std::function<void()> callback);
 
     int connection() const;  // the descriptor of the connection to the server
     // The user's dots per inch of texts (the X resource Xft.dpi), if any are set.
