@@ -1,0 +1,139 @@
+// Takes the screenshots of the documentation from the program itself, on a machine without a screen, so that
+// they are the same wherever they are taken: take_screenshots PROGRAM_FOLDER PICTURE_FOLDER
+
+#include <stb/stb_image_write.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <string>
+#include <vector>
+
+#include "app/program.hpp"
+#include "platform/headless/scripted_user.hpp"
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+// A player who always takes the largest cluster, and someone with a camera.
+class Photographer {
+ public:
+    Photographer(const std::string& programFolder, std::string pictureFolder, std::uint64_t seed)
+        : pictureFolder_(std::move(pictureFolder)), frontEnd_(programFolder), app_(loop_, registry_, seed) {
+        frontEnd_.connect(loop_);
+        program_.start();
+        user_.wait(3s);  // the splash has gone
+    }
+
+    void chooseFromMenu(int button) { user_.click(337, static_cast<float>(52.5 * button + 15)); }
+    void press(std::int16_t key) { user_.press(key); }
+    void wait(milliseconds duration) { user_.wait(duration); }
+    void pointAt(float x, float y) { user_.movePointer(x, y); }
+    void startAtLevel(int button, std::int16_t level) {
+        chooseFromMenu(button);
+        app_.game.stats.level = static_cast<std::int16_t>(level - 1);
+        while (app_.game.stats.level < level) {  // the waiting rows complete the level that was skipped
+            app_.game.rowsEntered = 1000;
+            user_.click(400, 515);
+            user_.press(keys::enter);
+        }
+    }
+
+    // Plays the largest clusters, up to a number of moves; false when there is none left.
+    bool play(int moves, std::int16_t smallest) {
+        for (int i = 0; i < moves; ++i) {
+            const auto place = largestCluster(smallest);
+            if (!place)
+                return false;
+            const bool isTraining = app_.game.gameMode == GameMode::Training;
+            const int top = isTraining ? 37 : 31;
+            user_.click(static_cast<float>(232 + 28 * (place->column - 1) + 14),
+                        static_cast<float>(top + 28 * (place->row - 1) + 14));
+            if (i + 1 < moves)
+                user_.wait(1s);
+        }
+        return true;
+    }
+
+    bool take(const std::string& name) {
+        const Surface& picture = user_.top().picture;
+        std::vector<unsigned char> bytes;
+        for (std::int32_t y = 0; y < picture.height(); ++y) {
+            for (const std::uint32_t pixel : picture.row(y)) {
+                const Colour colour = colourOf(pixel);
+                bytes.insert(bytes.end(), {colour.red, colour.green, colour.blue});
+            }
+        }
+        const std::string file = pictureFolder_ + "/" + name + ".png";
+        return stbi_write_png(file.c_str(), picture.width(), picture.height(), 3, bytes.data(),
+                              picture.width() * 3) != 0;
+    }
+
+ private:
+    std::optional<CellPosition> largestCluster(std::int16_t smallest) const {
+        std::optional<CellPosition> best;
+        std::int16_t size = smallest;
+        app_.game.grid.forEachCell([&](CellPosition place, const GridCell& cell) {
+            PlayGrid tried = app_.game.grid;
+            if (cell.kind != CellKind::Block || cell.colour == 0 || !tried.clusterAtLeast(place, size))
+                return;
+            size = static_cast<std::int16_t>(tried.removeMarked() + 1);
+            best = place;
+        });
+        return best;
+    }
+
+    std::string pictureFolder_;
+    HeadlessFrontEnd frontEnd_;
+    MessageLoop loop_{frontEnd_};
+    Registry registry_ = Registry::inMemory();
+    AppState app_;
+    ScriptedUser user_{frontEnd_, loop_};
+    Task<> program_ = runProgram(app_);
+};
+
+bool takeAll(const std::string& programFolder, const std::string& pictureFolder) {
+    bool isGood = true;
+    {
+        Photographer menu(programFolder, pictureFolder, 1);
+        menu.pointAt(337, 120);
+        isGood &= menu.take("menu");
+    }
+    {
+        Photographer training(programFolder, pictureFolder, 2);
+        training.chooseFromMenu(1);
+        training.play(9, 2);
+        isGood &= training.take("training_game");
+        training.wait(1s);
+        while (training.play(1, 2))
+            training.wait(1s);
+        training.wait(1s);
+        isGood &= training.take("result");
+    }
+    {
+        Photographer timed(programFolder, pictureFolder, 3);
+        timed.chooseFromMenu(2);
+        for (int i = 0; i < 14; ++i) {
+            timed.play(1, 3);
+            timed.wait(2150ms);
+        }
+        isGood &= timed.take("timed_game");
+    }
+    Photographer strategy(programFolder, pictureFolder, 4);
+    strategy.startAtLevel(3, 5);
+    strategy.play(4, 3);
+    strategy.wait(1s);
+    return strategy.take("strategy_game") && isGood;
+}
+
+}  // namespace
+}  // namespace quabble
+
+int main(int count, char** arguments) {
+    if (count != 3 || !quabble::takeAll(arguments[1], arguments[2])) {
+        std::fputs("take_screenshots PROGRAM_FOLDER PICTURE_FOLDER: could not write the pictures\n", stderr);
+        return EXIT_FAILURE;
+    }
+    return EXIT_SUCCESS;
+}
