@@ -1,0 +1,135 @@
+#include <gtest/gtest.h>
+#include <malloc.h>
+
+#include <filesystem>
+#include <memory>
+
+#include "../end_to_end/player.hpp"
+#include "machine.hpp"
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+// Someone who plays one game after the other for hours, keeps an own record of the scores and compares.
+class LongDay {
+ public:
+    TimePoint now() { return elapsed_ + (machine_->frontEnd.now() - TimePoint{}); }
+    int games() const { return games_; }
+
+    void playGame() {
+        ++games_;
+        const int mode = 1 + games_ % 3;
+        machine_->clickMenu(mode);
+        std::int32_t score = 0;
+        const int moves = 20 + games_ % 80;
+        for (int i = 0; i < moves && isPlaying(); ++i)
+            score += move(mode == 1 ? 2 : 3);
+        if (isPlaying())
+            machine_->clickPanel(mode == 1 ? 8 : 10);
+        machine_->user.wait(2s);
+        ASSERT_EQ(caption(), "Game Statistics");
+        machine_->closeDialog();
+        enterScore(mode, score);
+        ASSERT_TRUE(machine_->game.mainMenuActive && !machine_->hasDialog());
+        if (games_ % 50 == 0)
+            startAgain();
+    }
+
+    // Ends the program and starts it anew with what it has kept.
+    void startAgain() {
+        machine_->clickMenu(8);
+        ASSERT_TRUE(machine_->loop.ended());
+        elapsed_ = now();
+        machine_ = std::make_unique<Machine>(std::move(machine_->registry), games_);
+    }
+
+ private:
+    const std::string& caption() { return machine_->user.top().traits.caption; }
+    bool isPlaying() const { return machine_->game.isGameActive(); }
+
+    SeenBoard look() {
+        const std::string rows = machine_->seenRows(16);
+        SeenBoard board{};
+        for (std::size_t i = 0; i < 192; ++i)
+            board[i / 12][i % 12] = static_cast<int>(tileLetters.find(rows[i / 12 * 13 + i % 12]));
+        return board;
+    }
+
+    // The points that the move is worth; a level that it completes is acknowledged.
+    std::int32_t move(int smallest) {
+        const auto choice = choose(look(), smallest);
+        const int event = games_ + moves_++;
+        if (event % 29 == 0) {
+            machine_->clickPanel(machine_->game.classicActive ? 6 : 8);
+            EXPECT_TRUE(machine_->isPaused());
+            machine_->user.wait(10s);
+            machine_->user.click(300, 300);
+        }
+        if (choice)
+            machine_->clickCell(choice->column + 1, choice->row + 1);
+        else
+            machine_->clickStrip();
+        machine_->user.wait(700ms);
+        while (isPlaying() && machine_->hasDialog())
+            machine_->closeDialog();
+        return choice ? choice->size * (choice->size + 1) / 2 : 0;
+    }
+
+    void enterScore(int mode, std::int32_t score) {
+        HighScoreTable& expected = tables_.table(static_cast<std::int16_t>(mode));
+        const auto place =
+            std::ranges::find_if(expected.scores, [&](std::int32_t kept) { return score > kept; });
+        if (place != expected.scores.end()) {
+            ASSERT_EQ(caption(), "Best Score") << score;
+            const std::string name = "player " + std::to_string(games_);
+            machine_->user.type(name);
+            machine_->closeDialog();
+            const auto index = place - expected.scores.begin();
+            std::shift_right(place, expected.scores.end(), 1);
+            std::shift_right(expected.names.begin() + index, expected.names.end(), 1);
+            expected.scores[static_cast<std::size_t>(index)] = score;
+            expected.names[static_cast<std::size_t>(index)] = name;
+            machine_->closeDialog();
+        }
+        const HighScoreTable& kept = machine_->app.highScores.table(static_cast<std::int16_t>(mode));
+        EXPECT_EQ(kept.scores, expected.scores) << "game " << games_;
+        EXPECT_EQ(kept.names, expected.names) << "game " << games_;
+    }
+
+    std::unique_ptr<Machine> machine_ = std::make_unique<Machine>(Registry::inMemory());
+    HighScores tables_ = machine_->app.highScores;
+    TimePoint elapsed_{};
+    int games_ = 0;
+    int moves_ = 0;
+};
+
+std::ptrdiff_t openFiles() {
+    const std::filesystem::directory_iterator files("/proc/self/fd");
+    return std::distance(begin(files), end(files));
+}
+
+// QUABBLE_PLAY_HOURS=8 makes it a whole day.
+TEST(LongDay, EveryScoreIsKeptAndNothingIsLeftBehind) {
+    const char* wished = std::getenv("QUABBLE_PLAY_HOURS");
+    const auto hours =
+        std::chrono::duration<double, std::ratio<3600>>(wished == nullptr ? 1 : std::atof(wished));
+    const auto filesBefore = openFiles();
+    LongDay day;
+    std::size_t memory = 0;
+    while (day.now() - TimePoint{} < hours) {
+        day.playGame();
+        ASSERT_FALSE(HasFailure()) << "game " << day.games();
+        if (day.games() == 12)
+            memory = mallinfo2().uordblks;
+    }
+    day.startAgain();
+    EXPECT_GT(day.games(), 12);
+    EXPECT_LE(mallinfo2().uordblks, memory + 64 * 1024) << "after " << day.games() << " games";
+    EXPECT_EQ(openFiles(), filesBefore);
+    RecordProperty("games", day.games());
+}
+
+}  // namespace
+}  // namespace quabble
