@@ -1,6 +1,8 @@
 # Installs the system packages that are missing; to be sourced. Say which group is needed:
 #   need_packages play     to build and start the game
 #   need_packages check    to run every check as well
+#   need_packages package  to build the Debian package
+#   need_packages root     to make a fresh system to try things in
 
 say() { printf '%s: %s\n' "${0##*/}" "$*"; }
 fail() {
@@ -9,6 +11,7 @@ fail() {
 }
 
 packages_of() {
+    [ "$2" != root ] || { printf 'debootstrap'; return; }
     local list="cmake ninja-build g++ pkg-config libsdl2-dev libx11-dev libsqlite3-dev libstb-dev fonts-liberation librsvg2-bin xdg-utils"
     # From Debian 13 and Ubuntu 24.04 on, Sans Narrow is a package of its own.
     case "$1" in
@@ -16,8 +19,9 @@ packages_of() {
         debian-13 | ubuntu-24.04) list+=" fonts-liberation-sans-narrow" ;;
         *) return 1 ;;
     esac
-    [ "$2" = play ] ||
-        list+=" libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 xvfb openbox libxtst-dev"
+    [ "$2" != package ] || list+=" dpkg-dev lintian desktop-file-utils appstream man-db groff"
+    [ "$2" != check ] ||
+        list+=" libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 cppcheck valgrind xvfb openbox libxtst-dev"
     printf '%s' "$list"
 }
 
