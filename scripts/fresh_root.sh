@@ -5,7 +5,7 @@
 leave_fresh_root() {
     local mounted
     for mounted in dev/pts dev proc sys; do
-        mountpoint -q "$root/$mounted" && umount "$root/$mounted"
+        if mountpoint -q "$root/$mounted"; then umount --lazy "$root/$mounted"; fi
     done
     mountpoint -q "$root/dev" || mountpoint -q "$root/proc" || mountpoint -q "$root/sys" || rm -rf "$root"
 }

@@ -41,6 +41,7 @@ std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
     // long. Wayland has no other way.
     if (std::strcmp(SDL_GetCurrentVideoDriver(), "x11") == 0)
         SDL_SetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0");
+    X11Window::outliveErrors();
     SDL_EnableScreenSaver();
     SDL_StopTextInput();
     std::signal(SIGHUP, passOnHangUp);

@@ -48,6 +48,10 @@ std::optional<X11Window> X11Window::of(SDL_Window* window) {
     return X11Window(info.info.x11.display, info.info.x11.window);
 }
 
+void X11Window::outliveErrors() {
+    XSetErrorHandler([](Display*, XErrorEvent*) { return 0; });
+}
+
 void X11Window::whenServerGoes(std::function<void()> callback) {
     static std::function<void()> kept;
     kept = std::move(callback);

@@ -18,6 +18,9 @@ class X11Window {
     // Nothing on other desktops.
     static std::optional<X11Window> of(SDL_Window* window);
 
+    // Lets the program live on when the server refuses a request. SDL asks about frames that the window
+    // manager may have taken away meanwhile, and Xlib would end the process.
+    static void outliveErrors();
     // Calls this when the connection to the server is lost, and then ends the process with a failure. The
     // callback must ask nothing more of the server.
     static void whenServerGoes(std::function<void()> callback);
