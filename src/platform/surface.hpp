@@ -36,13 +36,16 @@ class Surface {
     void outline(const Rect& area, Colour colour);  // 1 pixel wide, within the rectangle
 
     // Copies the source's pixels from `from` on into the area; `andCopy` combines them with what is there by
-    // a bitwise AND.
+    // a bitwise AND. No line of one surface is copied over itself.
     void copy(const Rect& area, const Surface& source, Point from);
     void andCopy(const Rect& area, const Surface& source, Point from);
 
  private:
-    template <typename Combine>
-    void combine(const Rect& area, const Surface& source, Point from, Combine combine);
+    std::size_t index(std::int32_t x, std::int32_t y) const {
+        return static_cast<std::size_t>(y) * static_cast<std::size_t>(width_) + static_cast<std::size_t>(x);
+    }
+    template <typename CombineLine>
+    void combine(const Rect& area, const Surface& source, Point origin, CombineLine combineLine);
 
     std::int32_t width_ = 0;
     std::int32_t height_ = 0;
