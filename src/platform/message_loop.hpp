@@ -5,6 +5,7 @@
 #include <optional>
 #include <vector>
 
+#include "base/reused_memory.hpp"
 #include "base/task.hpp"
 #include "platform/front_end.hpp"
 #include "platform/input_event.hpp"
@@ -108,7 +109,7 @@ class MessageLoop {
     Window* findWindow(WindowId id) const;
 
     FrontEnd& frontEnd_;
-    std::deque<InputEvent> events_;
+    std::pmr::deque<InputEvent> events_{&reusedMemory()};
     std::vector<Timer*> timers_;
     std::vector<Window*> windows_;
     std::vector<Window*> modalWindows_;
