@@ -12,7 +12,7 @@ Task<bool> Game::putnextRow() {
     stage_.drawGauge(rowsPercentage());
     state_.grid.pushRowFromBottom(state_.nextRow);
     stage_.drawBoard();
-    state_.nextRow = makeNextRow(state_.grid.gridCols(), rowRecipe(), random_);
+    fillRow(state_.nextRow, rowRecipe(), random_);
     stage_.drawPreviewRow(state_.tickCount);
     if (state_.arcadeActive && state_.rowsEntered >= levelTable_[state_.stats.level].rowsToComplete)
         co_await completeLevel();

@@ -37,10 +37,14 @@ GridCell randomCell(const RowRecipe& recipe, RandomSource& random) {
 
 }  // namespace
 
-GridRow makeNextRow(std::int16_t gridCols, const RowRecipe& recipe, RandomSource& random) {
-    GridRow row(static_cast<std::size_t>(gridCols));
+void fillRow(GridRow& row, const RowRecipe& recipe, RandomSource& random) {
     for (GridCell& cell : row)
         cell = randomCell(recipe, random);
+}
+
+GridRow makeNextRow(std::int16_t gridCols, const RowRecipe& recipe, RandomSource& random) {
+    GridRow row(static_cast<std::size_t>(gridCols));
+    fillRow(row, recipe, random);
     return row;
 }
 

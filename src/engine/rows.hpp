@@ -21,6 +21,9 @@ struct RowRecipe {
 // 10 at 7 and 8 from 8 on. The first and the last colour are a little rarer than the others.
 GridRow makeNextRow(std::int16_t gridCols, const RowRecipe& recipe, RandomSource& random);
 
+// Draws every cell of a row that is there already anew.
+void fillRow(GridRow& row, const RowRecipe& recipe, RandomSource& random);
+
 // Empties the board, then fills its rows from `firstRow` down with random ones. Returns the last row made,
 // which is also the board's bottom row.
 GridRow fillBoard(PlayGrid& grid, std::int16_t firstRow, const RowRecipe& recipe, RandomSource& random);
