@@ -20,17 +20,18 @@ DesktopWait::~DesktopWait() {
 
 // On X11 this is not left to SDL: its own wait wakes itself by an event to one of the windows over a second
 // connection, which kills the program when the window has been closed before the server gets to it.
-void DesktopWait::sleep(SDL_Window* window, std::optional<milliseconds> longest) const {
+void DesktopWait::sleep(SDL_Window* window, std::optional<Clock::duration> longest) const {
     if (const auto x11 = X11Window::of(window)) {
         pollfd waiting{x11->connection(), POLLIN, 0};
-        const auto time = longest.value_or(milliseconds::zero());
-        const timespec end{time.count() / 1000, time.count() % 1000 * 1'000'000};
+        const auto time = std::chrono::nanoseconds(longest.value_or(Clock::duration::zero())).count();
+        const timespec end{time / 1'000'000'000, time % 1'000'000'000};
         ppoll(&waiting, 1, longest ? &end : nullptr, &before_);
         return;
     }
     sigset_t blocked;
     sigprocmask(SIG_SETMASK, &before_, &blocked);
-    SDL_WaitEventTimeout(nullptr, longest ? static_cast<int>(longest->count()) : -1);
+    const auto wholeTime = std::chrono::ceil<milliseconds>(longest.value_or(milliseconds(-1)));
+    SDL_WaitEventTimeout(nullptr, static_cast<int>(wholeTime.count()));
     sigprocmask(SIG_SETMASK, &blocked, nullptr);
 }
 

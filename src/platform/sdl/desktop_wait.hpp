@@ -20,7 +20,7 @@ class DesktopWait {
 
     // Comes back when SDL may have events, a signal came or the time is over; without a time it waits for
     // ever. The window is any of the program's.
-    void sleep(SDL_Window* window, std::optional<milliseconds> longest) const;
+    void sleep(SDL_Window* window, std::optional<Clock::duration> longest) const;
 
  private:
     sigset_t before_{};

@@ -82,11 +82,11 @@ void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
     }
 }
 
-std::optional<milliseconds> SdlFrontEnd::timeLeft(const MessageLoop& loop) {
+std::optional<Clock::duration> SdlFrontEnd::timeLeft(const MessageLoop& loop) {
     const auto deadline = loop.nextDeadline();
     if (!deadline)
         return std::nullopt;
-    return std::max(std::chrono::ceil<milliseconds>(*deadline - now()), milliseconds::zero());
+    return std::max(*deadline - now(), Clock::duration::zero());
 }
 
 void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {

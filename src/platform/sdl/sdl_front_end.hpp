@@ -45,7 +45,7 @@ class SdlFrontEnd final : public FrontEnd {
     DesktopWindow* find(WindowId window);
     WindowId idOf(std::uint32_t sdlWindow) const;
     void waitForEvents(MessageLoop& loop);
-    std::optional<milliseconds> timeLeft(const MessageLoop& loop);
+    std::optional<Clock::duration> timeLeft(const MessageLoop& loop);
     void take(const SDL_Event& event, MessageLoop& loop);
     bool isMeantForItsWindow(const SDL_Event& event);
 
