@@ -23,6 +23,7 @@ Task<> Main(AppState& app) {
     app.pictures = loadGraphics(app.programFolder);
     Splash splash(app);
     co_await app.loop.showModal(splash);
+    app.pictures.backdrop = {};  // only the splash shows it
     app.settings.solvingData.setSplashSeen();
     app.frmQuabble().show();
     app.frmQuabble().showMainMenu();
