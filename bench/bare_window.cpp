@@ -1,6 +1,5 @@
-// The least that a program with a window can be: bare_window WIDTH HEIGHT [MILLISECONDS]. It shows one solid
-// picture, another one after a click and, with a period, the same one again at every tick of it. It ends when
-// it is asked to.
+// The least that a program with a window can be: bare_window WIDTH HEIGHT. It shows one solid picture,
+// another one after a click, and ends when it is asked to.
 
 #include <SDL2/SDL.h>
 
@@ -20,14 +19,12 @@ int main(int argc, char** argv) {
     Uint32 colour = SDL_MapRGB(screen->format, 62, 105, 214);
     SDL_FillRect(screen, nullptr, colour);
     SDL_UpdateWindowSurface(window);
-    const int period = argc > 3 ? std::atoi(argv[3]) : -1;
-    for (SDL_Event event{}; event.type != SDL_QUIT;) {
-        const bool happened = SDL_WaitEventTimeout(&event, period) != 0;
-        const bool uncovered = event.type == SDL_WINDOWEVENT && event.window.event == SDL_WINDOWEVENT_EXPOSED;
-        const bool clicked = happened && event.type == SDL_MOUSEBUTTONDOWN;
+    SDL_Event event{};
+    while (event.type != SDL_QUIT && SDL_WaitEvent(&event) != 0) {
+        const bool clicked = event.type == SDL_MOUSEBUTTONDOWN;
         if (clicked)
             SDL_FillRect(screen, nullptr, colour ^= 0xFFFF);
-        if (!happened || uncovered || clicked)
+        if (clicked || (event.type == SDL_WINDOWEVENT && event.window.event == SDL_WINDOWEVENT_EXPOSED))
             SDL_UpdateWindowSurface(window);
     }
     SDL_DestroyWindow(window);
