@@ -12,7 +12,7 @@ fail() {
 
 packages_of() {
     [ "$2" != root ] || { printf 'debootstrap'; return; }
-    local list="cmake ninja-build g++ pkg-config libsdl2-dev libx11-dev libsqlite3-dev libstb-dev fonts-liberation librsvg2-bin xdg-utils"
+    local list="cmake ninja-build g++ pkg-config libsdl2-dev libx11-dev libxext-dev libsqlite3-dev libstb-dev fonts-liberation librsvg2-bin xdg-utils"
     # From Debian 13 and Ubuntu 24.04 on, Sans Narrow is a package of its own.
     case "$1" in
         debian-12) ;;

@@ -42,8 +42,8 @@ class FrontEnd {
 
     // Makes a window and shows it; it is black until its first pixels come.
     virtual void createWindow(WindowId window, const NativeWindow& traits) = 0;
-    // Shows the picture, of the window's client size, and keeps it: when the window is uncovered or restored
-    // the front end shows it again by itself.
+    // Shows the picture, of the window's client size. When the window is uncovered or restored the front end
+    // shows it again by itself: it must stay where it is until the next one or until the window is closed.
     virtual void showPixels(WindowId window, const Surface& picture) = 0;
     virtual void closeWindow(WindowId window) = 0;
     // Asks for the window to be minimised; an event reports when it is.

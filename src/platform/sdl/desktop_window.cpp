@@ -45,6 +45,8 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
         x11->setIcons(icons);
         if (isDialog)
             x11->haveOnlyCloseButton();
+        if (size == clientSize_)
+            shared_ = SharedPicture::of(*x11, size);
     }
 }
 
@@ -81,36 +83,51 @@ std::uint32_t DesktopWindow::sdlId() const {
 }
 
 void DesktopWindow::show(const Surface& picture) {
-    picture_ = picture;
-    if (window_ && (SDL_GetWindowFlags(sdl()) & SDL_WINDOW_HIDDEN) != 0) {
-        // On Wayland SDL makes the window anew when it first asks for a surface; that is not to be seen.
-        SDL_GetWindowSurface(sdl());
+    picture_ = &picture;
+    if (!window_)
+        return;
+    const bool isFirst = (SDL_GetWindowFlags(sdl()) & SDL_WINDOW_HIDDEN) != 0;
+    if (isFirst && !shared_)
+        SDL_GetWindowSurface(sdl());  // for which SDL makes a Wayland window anew; that is not to be seen
+    if (isFirst)
         SDL_ShowWindow(sdl());
-    }
-    showAgain();
+    if (shared_)
+        shared_->set(picture);
+    else if (SDL_Surface* screen = SDL_GetWindowSurface(sdl()))
+        fill(*screen, picture);
+    update();
 }
 
 void DesktopWindow::showAgain() {
-    SDL_Surface* screen = window_ && !picture_.isEmpty() ? SDL_GetWindowSurface(sdl()) : nullptr;
-    if (screen == nullptr)
+    if (picture_ == nullptr)
         return;
-    fill(*screen);
-    SDL_UpdateWindowSurface(sdl());
+    if (shared_ && size() != clientSize_)
+        shared_.reset();
+    if (!update())
+        show(*picture_);
 }
 
-void DesktopWindow::fill(SDL_Surface& screen) {
+// False when SDL's window surface, which still had the picture, is no longer of the window's size.
+bool DesktopWindow::update() {
+    if (!shared_)
+        return SDL_UpdateWindowSurface(sdl()) == 0;
+    shared_->show();
+    return true;
+}
+
+void DesktopWindow::fill(SDL_Surface& screen, const Surface& picture) {
     const Size shown{screen.w, screen.h};
     if (magnifier_.shownSize() != shown)
-        magnifier_ = Magnifier({picture_.width(), picture_.height()}, shown);
+        magnifier_ = Magnifier({picture.width(), picture.height()}, shown);
     const bool isOfOurFormat = screen.format->BytesPerPixel == 4 && screen.format->Rmask == 0xFF0000 &&
                                screen.format->Gmask == 0xFF00 && screen.format->Bmask == 0xFF;
     if (isOfOurFormat) {
-        magnifier_.show(picture_, static_cast<std::uint32_t*>(screen.pixels), screen.pitch);
+        magnifier_.show(picture, static_cast<std::uint32_t*>(screen.pixels), screen.pitch);
         return;
     }
     Surface whole(shown.width, shown.height);
     const int stride = shown.width * static_cast<int>(sizeof(std::uint32_t));
-    magnifier_.show(picture_, whole.row(0).data(), stride);
+    magnifier_.show(picture, whole.row(0).data(), stride);
     SDL_Surface* source = SDL_CreateRGBSurfaceWithFormatFrom(whole.row(0).data(), shown.width, shown.height,
                                                              32, stride, SDL_PIXELFORMAT_RGB888);
     SDL_BlitSurface(source, nullptr, &screen, nullptr);

@@ -6,6 +6,7 @@
 
 #include "platform/front_end.hpp"
 #include "platform/scaling.hpp"
+#include "platform/sdl/shared_picture.hpp"
 
 struct SDL_Window;
 struct SDL_Surface;
@@ -21,7 +22,8 @@ class DesktopWindow {
     SDL_Window* sdl() const { return window_.get(); }
     std::uint32_t sdlId() const;  // 0 when the desktop had no window to give
 
-    // Shows a picture of the window's client size. The first one brings the window onto the screen.
+    // Shows a picture of the window's client size, which must stay until the next one or the window's end.
+    // The first one brings the window onto the screen.
     void show(const Surface& picture);
     // A window that was uncovered, restored or resized gets its picture again.
     void showAgain();
@@ -34,7 +36,8 @@ class DesktopWindow {
     Size size() const;  // in the desktop's coordinates
     double scaleOf(const NativeWindow& traits) const;
     Point positionOf(const NativeWindow& traits, const DesktopWindow* owner) const;
-    void fill(SDL_Surface& screen);
+    bool update();
+    void fill(SDL_Surface& screen, const Surface& picture);
 
     struct Destroy {
         void operator()(SDL_Window* window) const;
@@ -42,7 +45,8 @@ class DesktopWindow {
     std::unique_ptr<SDL_Window, Destroy> window_;
     Size clientSize_;
     double scale_ = 1;
-    Surface picture_;
+    const Surface* picture_ = nullptr;
+    std::unique_ptr<SharedPicture> shared_;  // or else it is shown by SDL's window surface
     Magnifier magnifier_;
 };
 

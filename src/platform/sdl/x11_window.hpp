@@ -25,6 +25,8 @@ class X11Window {
     // callback must ask nothing more of the server.
     static void whenServerGoes(std::function<void()> callback);
 
+    _XDisplay* display() const { return display_; }
+    unsigned long id() const { return window_; }
     int connection() const;  // the descriptor of the connection to the server
     // The user's dots per inch of texts (the X resource Xft.dpi), if any are set.
     std::optional<double> dotsPerInch() const;

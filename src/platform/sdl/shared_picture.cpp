@@ -1,0 +1,118 @@
+#include "platform/sdl/shared_picture.hpp"
+
+#include <X11/Xlib.h>
+#include <X11/Xutil.h>
+#include <X11/extensions/XShm.h>
+#include <sys/ipc.h>
+#include <sys/shm.h>
+
+#include <bit>
+#include <cstring>
+#include <utility>
+
+namespace quabble {
+namespace {
+
+bool isLikeSurface(const XImage& image) {
+    constexpr int nativeOrder = std::endian::native == std::endian::little ? LSBFirst : MSBFirst;
+    return image.bits_per_pixel == 32 && image.byte_order == nativeOrder && image.red_mask == 0xFF0000 &&
+           image.green_mask == 0xFF00 && image.blue_mask == 0xFF;
+}
+
+}  // namespace
+
+struct SharedPicture::Segment {
+    explicit Segment(const X11Window& shownIn) : display(shownIn.display()), window(shownIn.id()) {}
+    ~Segment();
+    Segment(const Segment&) = delete;
+    Segment& operator=(const Segment&) = delete;
+
+    bool make(Size size);
+    bool attach();
+
+    Display* display;
+    ::Window window;
+    GC context = nullptr;
+    XImage* image = nullptr;
+    XShmSegmentInfo info{};
+    bool isAttached = false;
+};
+
+SharedPicture::Segment::~Segment() {
+    if (isAttached)
+        XShmDetach(display, &info);
+    if (info.shmaddr != nullptr)
+        shmdt(info.shmaddr);
+    if (image != nullptr) {
+        image->data = nullptr;  // which lay in the segment
+        XDestroyImage(image);
+    }
+    if (context != nullptr)
+        XFreeGC(display, context);
+}
+
+bool SharedPicture::Segment::make(Size size) {
+    XWindowAttributes attributes{};
+    if (XShmQueryExtension(display) == False || XGetWindowAttributes(display, window, &attributes) == 0)
+        return false;
+    context = XCreateGC(display, window, 0, nullptr);
+    image =
+        XShmCreateImage(display, attributes.visual, static_cast<unsigned>(attributes.depth), ZPixmap, nullptr,
+                        &info, static_cast<unsigned>(size.width), static_cast<unsigned>(size.height));
+    if (image == nullptr || !isLikeSurface(*image))
+        return false;
+    const auto bytes =
+        static_cast<std::size_t>(image->bytes_per_line) * static_cast<std::size_t>(size.height);
+    info.shmid = shmget(IPC_PRIVATE, bytes, IPC_CREAT | 0600);
+    if (info.shmid < 0)
+        return false;
+    void* address = shmat(info.shmid, nullptr, 0);
+    if (address != reinterpret_cast<void*>(-1)) {
+        info.shmaddr = image->data = static_cast<char*>(address);
+        isAttached = attach();
+    }
+    shmctl(info.shmid, IPC_RMID, nullptr);  // it goes with the last who is attached
+    return isAttached;
+}
+
+bool SharedPicture::Segment::attach() {
+    static bool isRefused;
+    isRefused = false;
+    XSync(display, False);
+    const auto before = XSetErrorHandler([](Display*, XErrorEvent*) {
+        isRefused = true;
+        return 0;
+    });
+    XShmAttach(display, &info);
+    XSync(display, False);
+    XSetErrorHandler(before);
+    return !isRefused;
+}
+
+std::unique_ptr<SharedPicture> SharedPicture::of(const X11Window& window, Size size) {
+    auto segment = std::make_unique<Segment>(window);
+    if (!segment->make(size))
+        return nullptr;
+    return std::unique_ptr<SharedPicture>(new SharedPicture(std::move(segment)));
+}
+
+SharedPicture::SharedPicture(std::unique_ptr<Segment> segment) : segment_(std::move(segment)) {}
+
+SharedPicture::~SharedPicture() = default;
+
+void SharedPicture::set(const Surface& picture) {
+    const XImage& image = *segment_->image;
+    for (std::int32_t y = 0; y < picture.height(); ++y) {
+        const auto line = picture.row(y);
+        std::memcpy(image.data + std::ptrdiff_t{y} * image.bytes_per_line, line.data(), line.size_bytes());
+    }
+}
+
+void SharedPicture::show() {
+    XImage* image = segment_->image;
+    XShmPutImage(segment_->display, segment_->window, segment_->context, image, 0, 0, 0, 0,
+                 static_cast<unsigned>(image->width), static_cast<unsigned>(image->height), False);
+    XFlush(segment_->display);
+}
+
+}  // namespace quabble
