@@ -11,7 +11,6 @@ namespace {
 constexpr std::int32_t panelLeft = 200;
 constexpr std::int32_t arcadePanelTop = 5;
 constexpr double pointsPoints = 8;
-constexpr double captionPoints = 14;
 
 }  // namespace
 
@@ -43,7 +42,6 @@ void MainWindow::drawClassicPanel() {
 
 void MainWindow::drawArcadePanel() {
     drawPanel(arcadeBtns_, string_ids::arcadePanelBase);
-    drawValue(arcadeBtns_[panel_boxes::level], app_.game.stats.level, false);
 }
 
 void MainWindow::drawPlayPanel() {
@@ -68,7 +66,6 @@ void MainWindow::drawPoints(CellPosition place, std::int32_t points) {
                   .textColour = palette::panelTextColour};
     canvas().font.points = pointsPoints;
     drawLabelledBox(pointsBox_, BoxStyle::Plain, false, 2, std::to_string(points));
-    canvas().font.points = captionPoints;
 }
 
 // Both side panels have the score's box in the same place.
@@ -114,7 +111,6 @@ Task<> MainWindow::showResult(bool goNextLevel) {
     ResultDialog& diagWow = app_.diagWow();
     diagWow.goNextLevel = goNextLevel;
     co_await loop().showModal(diagWow);
-    diagWow.goNextLevel = false;
 }
 
 Task<std::string> MainWindow::enterName() {

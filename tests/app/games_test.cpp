@@ -183,6 +183,7 @@ TEST(TimedGame, UncoversAndPushesRowsUntilTheLevelIsComplete) {
     EXPECT_TRUE(machine.game.tickCount == 0 && !isFull(0));
     machine.user.wait(1ms);
     EXPECT_EQ(machine.game.tickCount, 1);
+    expectGolden(machine.picture(), "timed_game.png");
 }
 
 TEST(TimedGame, GoesOnAfterAMoveAndAPauseWhereItStopped) {
@@ -264,7 +265,7 @@ TEST(StrategyGame, BombExplodesFallsClosesReleasesStonesAndBringsOneRow) {
     EXPECT_EQ(machine.game.rowsEntered, 1);
 }
 
-TEST(Golden, MenuAndMove) {
+TEST(Golden, MenuMoveAndHighScore) {
     Machine machine;
     machine.pointAtMenu(3);
     expectGolden(machine.picture(), "menu.png");
@@ -273,6 +274,15 @@ TEST(Golden, MenuAndMove) {
     machine.user.movePointer(95, 385);
     machine.clickCell(3, 16);
     expectGolden(machine.picture(), "training_game.png");
+    machine.app.highScores.table(1) = {};
+    machine.clickPanel(8);
+    machine.user.wait(1s);
+    machine.closeDialog();
+    machine.user.type("Zo\u00EB");
+    expectGolden(machine.user.top().picture, "name_entry.png");
+    machine.closeDialog();
+    machine.user.movePointer(150, 420);
+    expectGolden(machine.user.top().picture, "high_scores.png");
 }
 
 }  // namespace
