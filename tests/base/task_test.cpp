@@ -133,21 +133,11 @@ TEST(Task, DestroyedWhileItWaitsUnwindsInnermostFirst) {
     EXPECT_TRUE(taken.done());
 }
 
-Task<int> one() {
-    co_return 1;
-}
-
-Task<int> oneLevelDeeper() {
-    const int value = co_await one();
-    co_return value;
-}
-
 Task<> countTo(int turns, Gate& gate, int gateAt, int& counted) {
     for (int i = 0; i < turns; ++i) {
         if (i == gateAt)
             co_await gate;
-        const int value = co_await oneLevelDeeper();
-        counted += value;
+        co_await addBoxed(counted, 1);
     }
 }
 
