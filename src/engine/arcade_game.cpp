@@ -109,7 +109,7 @@ Task<> Game::arcadeGameBoardClick(CellPosition place) {
 
 // Lets go of the stones that nothing but stones lies above.
 Task<> Game::releaseExposedStones(std::chrono::milliseconds closingPause) {
-    if (releaseStones(false) == 0)
+    if (!releaseStones(false))
         co_return;
     releaseStones(true);
     stage_.present();
@@ -122,23 +122,22 @@ Task<> Game::releaseExposedStones(std::chrono::milliseconds closingPause) {
     showBoard();
 }
 
-// Finds every exposed stone: counts it and paints it as released or, with `remove`, empties its cell.
-std::int16_t Game::releaseStones(bool remove) {
-    std::int16_t counted = 0;
+// Paints every exposed stone as released or, with `remove`, empties its cell; true when there was any.
+bool Game::releaseStones(bool remove) {
+    bool found = false;
     for (std::int16_t column = 1; column <= state_.grid.gridCols(); ++column) {
         for (std::int16_t row = state_.grid.gridRows(); row >= 1; --row) {
             const CellPosition place{column, row};
             if (state_.grid.at(place).colour != stoneColour || !state_.grid.isStoneExposed(place))
                 continue;
-            if (remove) {
+            found = true;
+            if (remove)
                 state_.grid.at(place) = GridCell{};
-            } else {
-                ++counted;
+            else
                 stage_.drawCell(place, tiles::releasedStone);
-            }
         }
     }
-    return counted;
+    return found;
 }
 
 }  // namespace quabble

@@ -60,7 +60,7 @@ class Game {
     RowRecipe rowRecipe() const;
     double rowsPercentage() const;
     std::int32_t removeCluster();
-    std::int16_t releaseStones(bool remove);
+    bool releaseStones(bool remove);
     void paintColourCells(std::int16_t colour, std::int16_t tile);
     void showBoard();
 

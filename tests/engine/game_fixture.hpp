@@ -30,9 +30,13 @@ inline int countOf(const std::string& word, const std::string& text) {
 // colours and of colour 4 when there are four.
 class ConstantRandom final : public RandomSource {
  public:
-    double next() override { return value; }
+    double next() override {
+        ++drawn;
+        return value;
+    }
 
     double value = 0.5;
+    int drawn = 0;
 };
 
 // Runs a task that never really has to wait.

@@ -34,9 +34,11 @@ TEST_F(Moves, EveryGameStartsClean) {
             const auto table = static_cast<std::int16_t>(c.mode);
             highScores = {};
             highScores.insertHighScore(table, c.bestScore, "");
+            random.drawn = 0;
             start(c.mode);
             EXPECT_EQ(stage.takeLines(), lines(c.before + "board=" + fullRows(c.rows, '2') + c.after));
             EXPECT_EQ(show(state.nextRow), fullRows(1, '2'));
+            EXPECT_EQ(random.drawn, 2 * 12 * c.rows);
             EXPECT_EQ(state.classicActive, c.mode == GameMode::Training);
             EXPECT_EQ(state.arcadeActive, c.mode != GameMode::Training);
             EXPECT_FALSE(state.mainMenuActive);
@@ -143,6 +145,8 @@ TEST_F(Moves, OtherClicksReleaseStonesAtMost) {
                 {6, 16}, "");
     expectClick("too few cells, one stone covered", GameMode::Strategy, ".....S/.....1/.....S/.....2",
                 {6, 16}, "cell=6,13:6 present pause=120 board=.....1/.....S/.....2 present");
+    expectClick("too few cells, a stone in the top row", GameMode::Strategy, ".....S///////////////.....1",
+                {6, 16}, "cell=6,1:6 present pause=120 board=.....1 present");
     expectClick("a stone", GameMode::Strategy, ".....S/.....SS", {6, 16}, "");
     expectClick("an empty cell", GameMode::Strategy, ".....S/.....11", {8, 16}, "");
 }
