@@ -26,9 +26,7 @@ void prepareFile(const std::filesystem::path& file) {
         folder /= part;
         ::mkdir(folder.c_str(), userOnlyFolder);
     }
-    const int descriptor = ::open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, userOnlyFile);
-    if (descriptor >= 0)
-        ::close(descriptor);
+    ::close(::open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, userOnlyFile));
 }
 
 std::string homeFolder() {

@@ -67,36 +67,25 @@ std::unique_ptr<RegistryDatabase> RegistryDatabase::connect(const std::string& p
 std::unique_ptr<RegistryDatabase> RegistryDatabase::open(const std::string& path) {
     auto database = connect(path);
     const bool isWritable = database && sqlite3_db_readonly(database->connection_.get(), "main") == 0;
-    if (!isWritable || !database->begin())
+    if (!isWritable || !database->begin() || !database->isOrBecomesRegistry())
         return nullptr;
-    if (!database->isOrBecomesRegistry()) {
-        database->abandon();
-        return nullptr;
-    }
+    database->inTransaction_ = true;
     return database;
 }
 
-// Whatever could not be brought to the disk is rolled back when the connection closes.
+// What is not committed, or cannot be, is rolled back when the connection closes.
 RegistryDatabase::~RegistryDatabase() {
     if (inTransaction_)
         execute("COMMIT");
 }
 
 bool RegistryDatabase::begin() {
-    inTransaction_ = execute("PRAGMA synchronous = EXTRA") && execute("BEGIN IMMEDIATE");
-    return inTransaction_;
+    return execute("PRAGMA synchronous = EXTRA") && execute("BEGIN IMMEDIATE");
 }
 
 bool RegistryDatabase::change(RegistryStatement& statement) {
-    if (inTransaction_ && !statement.run())
-        abandon();
+    inTransaction_ = inTransaction_ && statement.run();
     return inTransaction_;
-}
-
-// SQLite may have rolled back by itself, in which case this fails and nothing is left to do.
-void RegistryDatabase::abandon() {
-    execute("ROLLBACK");
-    inTransaction_ = false;
 }
 
 bool RegistryDatabase::isOrBecomesRegistry() {

@@ -45,7 +45,7 @@ class RegistryDatabase {
 
     RegistryStatement prepare(std::string_view sql) { return {connection_.get(), sql}; }
 
-    // Carries out a change that is part of the transaction. When one fails, all are taken back and no other
+    // Carries out a change that is part of the transaction. When one fails, none will be kept and no other
     // is carried out: a registry that has half of what was meant would be worse than the one before.
     bool change(RegistryStatement& statement);
 
@@ -56,7 +56,6 @@ class RegistryDatabase {
     explicit RegistryDatabase(sqlite3* connection) : connection_(connection) {}
     bool execute(const char* sql);
     bool begin();
-    void abandon();
     bool isOrBecomesRegistry();
 
     std::unique_ptr<sqlite3, Close> connection_;
