@@ -37,7 +37,6 @@ TEST(PlayGrid, ClustersAreFoundWholeAndRemoved) {
 }
 
 TEST(PlayGrid, OccupiedCellsMoveAsFarAsTheyCan) {
-    const std::string high = "1a" + std::string(15, '/');
     struct Case {
         std::string name, before;
         Direction direction;
@@ -45,8 +44,6 @@ TEST(PlayGrid, OccupiedCellsMoveAsFarAsTheyCan) {
     };
     const std::string scattered = "1S.3//.a2/..4";
     const Case cases[] = {{"down", scattered, Direction::Down, ".S2/1a43"},
-                          {"down from the top row", high, Direction::Down, "1a"},
-                          {"down onto others", high + ".S", Direction::Down, ".a/1S"},
                           {"right", scattered, Direction::Right, ".........1S3//..........a2/...........4"},
                           {"left", scattered, Direction::Left, "1S3//a2/4"},
                           {"up", "////////////..1//.a/1.2", Direction::Up, "1a1/..2//////////////"}};
@@ -93,13 +90,6 @@ TEST(PlayGrid, AMoveIsLeftWhileTwoOfAColourTouch) {
     for (const std::string open :
          {"1211", "..........11", "21/32/1..........2/2..........2", "1a", "SS", "bb"})
         EXPECT_FALSE(board(open).noMovesLeft()) << open;
-}
-
-TEST(PlayGrid, StonesAreExposedWhileOnlyStonesLieAbove) {
-    for (const std::string exposed : {"S", "S//S", "S/S/S", ".1/S", "S///////////////S"})
-        EXPECT_TRUE(board(exposed).isStoneExposed({1, 16})) << exposed;
-    for (const std::string covered : {"1/S", "1/S/S", "a//S", "S/2/S", "1///////////////S"})
-        EXPECT_FALSE(board(covered).isStoneExposed({1, 16})) << covered;
 }
 
 TEST(PlayGrid, RowsEnterFromBelow) {
