@@ -11,6 +11,7 @@ namespace {
 constexpr std::int32_t panelLeft = 200;
 constexpr std::int32_t arcadePanelTop = 5;
 constexpr double pointsPoints = 8;
+constexpr double captionPoints = 14;
 
 }  // namespace
 
@@ -42,6 +43,7 @@ void MainWindow::drawClassicPanel() {
 
 void MainWindow::drawArcadePanel() {
     drawPanel(arcadeBtns_, string_ids::arcadePanelBase);
+    drawValue(arcadeBtns_[panel_boxes::level], app_.game.stats.level, false);
 }
 
 void MainWindow::drawPlayPanel() {
@@ -66,6 +68,7 @@ void MainWindow::drawPoints(CellPosition place, std::int32_t points) {
                   .textColour = palette::panelTextColour};
     canvas().font.points = pointsPoints;
     drawLabelledBox(pointsBox_, BoxStyle::Plain, false, 2, std::to_string(points));
+    canvas().font.points = captionPoints;
 }
 
 // Both side panels have the score's box in the same place.
@@ -111,6 +114,7 @@ Task<> MainWindow::showResult(bool goNextLevel) {
     ResultDialog& diagWow = app_.diagWow();
     diagWow.goNextLevel = goNextLevel;
     co_await loop().showModal(diagWow);
+    diagWow.goNextLevel = false;
 }
 
 Task<std::string> MainWindow::enterName() {
