@@ -274,15 +274,17 @@ TEST(Golden, MenuMoveAndHighScore) {
     machine.user.movePointer(95, 385);
     machine.clickCell(3, 16);
     expectGolden(machine.picture(), "training_game.png");
-    machine.app.highScores.table(1) = {};
+    machine.app.highScores.table(1) = {{2'000'000'000}, {std::string(19, 'W')}};
     machine.clickPanel(8);
     machine.user.wait(1s);
     machine.closeDialog();
     machine.user.type("Zo\u00EB");
     expectGolden(machine.user.top().picture, "name_entry.png");
     machine.closeDialog();
-    machine.user.movePointer(150, 420);
+    machine.user.movePointer(300, 420);
     expectGolden(machine.user.top().picture, "high_scores.png");
+    machine.user.movePointer(150, 420);
+    expectGolden(machine.user.top().picture, "high_scores_ok.png");
 }
 
 }  // namespace

@@ -68,6 +68,7 @@ TEST(ScoreView, ClearsTheTableThatItShows) {
     EXPECT_TRUE(bytesOf(machine.user.top().picture) == bytesOf(before));
     machine.user.movePointer(300, 420);
     machine.user.click(300, 420);
+    EXPECT_FALSE(isFlat(machine.user.top().picture, {280, 410, 400, 430}));
     EXPECT_NE(machine.user.pixel(270, 420), palette::highlightColour) << "the button is drawn at rest";
     machine.user.movePointer(301, 420);
     EXPECT_NE(machine.user.pixel(270, 420), palette::highlightColour) << "and counts as highlighted still";
@@ -81,6 +82,10 @@ TEST(ScoreView, ClearsTheTableThatItShows) {
     EXPECT_FALSE(machine.hasDialog());
     machine.clickMenu(5);
     EXPECT_TRUE(bytesOf(machine.user.top().picture) == bytesOf(cleared)) << "all of it was painted anew";
+    machine.user.press('q');
+    EXPECT_TRUE(machine.hasDialog());
+    machine.user.press(keys::escape);
+    EXPECT_FALSE(machine.hasDialog());
 }
 
 TEST(Splash, ClosesOnItsSecondTickWhateverIsClicked) {
