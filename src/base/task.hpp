@@ -50,7 +50,10 @@ class TaskPromise : public TaskPromiseBase {
  public:
     Task<T> get_return_object();
     void return_value(T result) { value = std::move(result); }
-    T takeResult() { return std::move(*value); }
+    T takeResult() {
+        assert(value);
+        return std::move(*value);
+    }
 
  private:
     std::optional<T> value;

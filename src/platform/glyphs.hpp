@@ -1,6 +1,7 @@
 #pragma once
 
 #include <array>
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <optional>
@@ -19,7 +20,7 @@ struct Glyph {
     std::vector<std::uint8_t> coverage;
 
     std::uint8_t coverageAt(std::int32_t x, std::int32_t y) const {
-        return coverage[static_cast<std::size_t>(y * width + x)];
+        return coverage[static_cast<std::size_t>(std::ptrdiff_t{y} * width + x)];
     }
 };
 

@@ -24,6 +24,7 @@ class Window;
 class MessageLoop {
  public:
     explicit MessageLoop(FrontEnd& frontEnd) : frontEnd_(frontEnd) {}
+    ~MessageLoop() = default;
     MessageLoop(const MessageLoop&) = delete;
     MessageLoop& operator=(const MessageLoop&) = delete;
 

@@ -55,7 +55,7 @@ class HeadlessFrontEnd final : public FrontEnd {
  private:
     MessageLoop* loop_ = nullptr;
     std::string executableFolder_;
-    TimePoint now_{};
+    TimePoint now_;
     std::map<WindowId, Shown> windows_;
 };
 

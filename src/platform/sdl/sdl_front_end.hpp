@@ -22,6 +22,8 @@ class SdlFrontEnd final : public FrontEnd {
     // Nothing when there is no display to open windows on; `problem` then says why.
     static std::unique_ptr<SdlFrontEnd> open(std::string& problem);
     ~SdlFrontEnd() override;
+    SdlFrontEnd(const SdlFrontEnd&) = delete;
+    SdlFrontEnd& operator=(const SdlFrontEnd&) = delete;
 
     // Waits for the desktop's events and passes them to the loop until the program has ended.
     void run(MessageLoop& loop);

@@ -7,6 +7,7 @@
 #include <sys/shm.h>
 
 #include <bit>
+#include <cstdint>
 #include <cstring>
 #include <utility>
 
@@ -67,7 +68,7 @@ bool SharedPicture::Segment::make(Size size) {
     if (info.shmid < 0)
         return false;
     void* address = shmat(info.shmid, nullptr, 0);
-    if (address != reinterpret_cast<void*>(-1)) {
+    if (std::bit_cast<std::intptr_t>(address) != -1) {
         info.shmaddr = image->data = static_cast<char*>(address);
         isAttached = attach();
     }
