@@ -17,7 +17,6 @@ class Gate {
     void await_suspend(std::coroutine_handle<> waiter) noexcept { waiter_ = waiter; }
     void await_resume() const noexcept {}
 
-    bool isAwaited() const { return waiter_ != nullptr; }
     void open() { std::exchange(waiter_, {}).resume(); }
 
  private:
@@ -61,37 +60,6 @@ Task<> sumOfDoubled(Gate& gate, int turns, int& sum) {
         const int value = co_await doubled(gate, i);
         sum += value;
     }
-}
-
-TEST(Task, StartsOnlyWhenStartedAndPassesResultsOn) {
-    int sum = 0;
-    Task<> task = addBoxed(sum, 7);
-    EXPECT_EQ(sum, 0);
-    EXPECT_FALSE(task.done());
-    task.start();
-    EXPECT_EQ(sum, 7);
-    EXPECT_TRUE(task.done());
-
-    {
-        const Task<> neverStarted = addBoxed(sum, 5);
-    }
-    EXPECT_EQ(sum, 7);
-}
-
-TEST(Task, GoesOnWhereItWaitedWithTheResultOfItsWait) {
-    Gate gate;
-    int sum = 0;
-    Task<> task = sumOfDoubled(gate, 3, sum);
-    task.start();
-    const int sums[] = {2, 6, 12};
-    for (const int expected : sums) {
-        EXPECT_FALSE(task.done());
-        ASSERT_TRUE(gate.isAwaited());
-        gate.open();
-        EXPECT_EQ(sum, expected);
-    }
-    EXPECT_TRUE(task.done());
-    EXPECT_FALSE(gate.isAwaited());
 }
 
 Task<> innermost(Gate& gate, std::string& log) {

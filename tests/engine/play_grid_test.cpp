@@ -8,34 +8,6 @@
 namespace quabble {
 namespace {
 
-TEST(PlayGrid, ClustersAreFoundWholeAndRemoved) {
-    struct Case {
-        std::string name, before;
-        CellPosition place;
-        std::int16_t size;
-        std::string after;
-    };
-    const Case cases[] = {
-        {"single", "212/121/212", {2, 15}, 1, "212/1.1/212"},
-        {"touching at corners", "1.1/.1/1.1", {2, 15}, 1, "1.1//1.1"},
-        {"L", "12/12/11", {1, 14}, 4, ".2/.2/"},
-        {"U", "131/121/111", {3, 14}, 7, ".3/.2/"},
-        {"ring", "1111/1221/1111", {2, 16}, 10, ".22/"},
-        {"not round a row's end", "...........1/1..........2", {1, 16}, 1, "...........1/...........2"},
-        {"bomb among blocks of its colour", "ab1/1.1/111", {3, 14}, 7, ".b//"},
-        {"stones", "SS1/S11", {1, 15}, 3, "..1/.11"},
-        {"the whole board", fullRows(16, '1'), {12, 1}, 192, ""},
-    };
-    for (const Case& c : cases) {
-        PlayGrid grid = board(c.before);
-        EXPECT_FALSE(grid.clusterAtLeast(c.place, static_cast<std::int16_t>(c.size + 1))) << c.name;
-        EXPECT_TRUE(grid.clusterAtLeast(c.place, c.size)) << c.name;
-        EXPECT_EQ(show(grid), c.before) << c.name;
-        EXPECT_EQ(grid.removeMarked(), c.size) << c.name;
-        EXPECT_EQ(show(grid), c.after) << c.name;
-    }
-}
-
 TEST(PlayGrid, OccupiedCellsMoveAsFarAsTheyCan) {
     struct Case {
         std::string name, before;
@@ -82,14 +54,6 @@ TEST(PlayGrid, EmptyColumnsCloseTowardTheMiddle) {
         EXPECT_FALSE(grid.closeColumns()) << settled;
         EXPECT_EQ(show(grid), settled);
     }
-}
-
-TEST(PlayGrid, AMoveIsLeftWhileTwoOfAColourTouch) {
-    for (const std::string over : {"", "1", "1212/2121", "1.1/.1", "...........1/1"})
-        EXPECT_TRUE(board(over).noMovesLeft()) << over;
-    for (const std::string open :
-         {"1211", "..........11", "21/32/1..........2/2..........2", "1a", "SS", "bb"})
-        EXPECT_FALSE(board(open).noMovesLeft()) << open;
 }
 
 TEST(PlayGrid, RowsEnterFromBelow) {
