@@ -19,5 +19,8 @@ function(quabble_room name)
   list(TRANSFORM ARG_SOURCES PREPEND ${CMAKE_SOURCE_DIR}/src/${folder}/)
   add_library(${name} STATIC ${ARG_SOURCES})
   target_include_directories(${name} PUBLIC ${door})
+  if(QUABBLE_SANITIZE)
+    target_compile_options(${name} PRIVATE -fsanitize=fuzzer-no-link)  # the fuzz targets see what is reached
+  endif()
   target_link_libraries(${name} PUBLIC ${ARG_ROOMS} PRIVATE ${ARG_LIBRARIES})
 endfunction()
