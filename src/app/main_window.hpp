@@ -21,7 +21,7 @@ class MainWindow final : public Window, private Stage {
  public:
     explicit MainWindow(AppState& app);
 
-    // Draws the main menu and makes it the current screen.
+    // Draws the main menu and makes it the current screen. A pause is over.
     void showMainMenu() override;
 
     bool isPaused() const { return gamePaused_; }

@@ -31,7 +31,8 @@ class Game {
     // A click on the game's screen at a window pixel; it acts when it hits a cell that can be played.
     Task<> gameBoardClick(std::int16_t xVal, std::int16_t yVal);
 
-    // Pushes the waiting row into the board. False when there was no room and the game has ended.
+    // Pushes the waiting row into the board. False when there was no room and the game has ended, and when it
+    // ends after the move that is under way.
     Task<bool> putnextRow();
 
     // One tick of the block timer: uncovers one more cell of the waiting row, the twelfth pushes the row.

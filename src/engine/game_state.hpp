@@ -9,10 +9,12 @@
 
 namespace quabble {
 
-// Everything about the game being played that its screen reads. Zero before the first game.
+// Everything about the game being played that its screen reads. Before the first game the
+// numbers are zero.
 struct GameState {
     GameMode gameMode = GameMode::None;
-    std::int16_t scoreTableIndex = 0;  // the high-score table of the mode chosen last, 1 to 3
+    std::int16_t scoreTableIndex =
+        0;  // the high-score table of the mode chosen last, 1 to 3; 0 before any was
     GameStats stats;
 
     PlayGrid grid;

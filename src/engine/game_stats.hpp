@@ -11,7 +11,8 @@ struct GameStats {
     std::int32_t score = 0;
     std::int32_t blocksCleared = 0;   // by clusters, in the current classic game or arcade level
     std::int32_t largestCluster = 0;  // likewise
-    std::int16_t level = 0;      // 1 in a classic game; 1 to 10, and 11 once all are done, in an arcade game
+    // 1 in a classic game; 1 to 10, and 11 once all are done, in an arcade game; 0 before the first.
+    std::int16_t level = 0;
     std::int32_t bestScore = 0;  // the mode's best score when the game started
 };
 

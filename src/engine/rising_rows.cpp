@@ -3,6 +3,8 @@
 namespace quabble {
 
 Task<bool> Game::putnextRow() {
+    if (endRequested_)
+        co_return false;
     if (state_.grid.isTopRowOccupied()) {
         co_await gameOver();
         co_return false;

@@ -13,8 +13,8 @@ namespace quabble {
 // What a game asks of the screen it is played on. Drawing stays invisible until `present`. The screen reads
 // what it draws (board, waiting row, numbers) from the game's state.
 //
-// In `runPendingMessages` and while a dialog is shown the player may act and the world may change; in `pause`
-// nothing is delivered.
+// In `runPendingMessages` the player may act and the state may change; while a dialog is shown only the
+// dialog can be acted on; in `pause` nothing is delivered.
 class Stage {
  public:
     virtual ~Stage() = default;

@@ -9,7 +9,7 @@
 
 namespace quabble {
 
-// What a drawn box is for; the order and the values are those of a button's `active` number.
+// What a drawn box is for; the values are those of a button's `active` number.
 enum class BoxKind : std::int32_t { ValueBox = -1, Label = 0, Button = 1 };
 
 // A rectangle that is drawn on a window: a button, a label, a value box, the board or a whole background.

@@ -24,7 +24,7 @@ class Control {
 
     virtual void paint(Surface& surface, bool hasFocus) const = 0;
     virtual Task<> mouseDown(Point at, bool extends) = 0;
-    // The pointer moved, or the button was let go, after a press on the control.
+    // The pointer moved after a press on the control, and the button is still held.
     virtual void mouseDrag(Point /*at*/) {}
 
     virtual bool takesFocus() const { return false; }

@@ -19,9 +19,10 @@ enum class WindowId : std::uint32_t { none = 0 };
 
 // What a native window is made from. It never changes its size.
 struct NativeWindow {
-    std::string caption;            // UTF-8
-    Size clientSize;                // what the program paints
-    std::optional<Point> position;  // of its outer frame; without one, centred on its owner or the screen
+    std::string caption;  // UTF-8
+    Size clientSize;      // what the program paints
+    std::optional<Point>
+        position;  // of its outer frame on the first screen; without one, centred on its owner or the screen
     bool borderless = false;
     WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner and centres on it
 };
@@ -50,6 +51,7 @@ class FrontEnd {
     virtual void minimiseWindow(WindowId /*window*/) {}
     // The icon, in several sizes, of all windows that are made from now on.
     virtual void setIcons(std::span<const Icon> /*icons*/) {}
+    // Of the first screen.
     virtual Size screenSize() { return {1024, 768}; }
 
     // Shows a message with an OK button and waits for it.

@@ -111,33 +111,32 @@ TEST_F(InterruptedMoves, GiveUpWhenTheStripEndsTheGame) {
 
 TEST_F(InterruptedMoves, LeaveAGameStartedMeanwhileAlone) {
     for (const GameMode mode : {GameMode::Training, GameMode::Timed, GameMode::Strategy}) {
-        for (const bool wishedToEnd : {false, true}) {
-            play(GameMode::Strategy, fullBoard());
-            std::vector<Action> actions{clickStrip, startGame(mode)};
-            if (wishedToEnd)
-                actions.insert(actions.begin(), endGame);
-            const std::string recorded = moveWith(actions, 1);
-            EXPECT_EQ(countOf("result:", recorded), 1);
-            const std::string lastOfStart =
-                mode == GameMode::Training ? "present present" : "level=1 present";
-            EXPECT_TRUE(recorded.ends_with(lines(lastOfStart))) << recorded;
-            EXPECT_EQ(show(state.grid), fullRows(mode == GameMode::Training ? 16 : 4, '2'));
-            EXPECT_EQ(state.stats.score + state.rowsEntered, 0);
-            EXPECT_FALSE(state.boolProcessing);
+        play(GameMode::Strategy, fullBoard());
+        const std::string recorded = moveWith({clickStrip, startGame(mode)}, 1);
+        EXPECT_EQ(countOf("result:", recorded), 1);
+        const std::string lastOfStart = mode == GameMode::Training ? "present present" : "level=1 present";
+        EXPECT_TRUE(recorded.ends_with(lines(lastOfStart))) << recorded;
+        EXPECT_EQ(show(state.grid), fullRows(mode == GameMode::Training ? 16 : 4, '2'));
+        EXPECT_EQ(state.stats.score + state.rowsEntered, 0);
+        EXPECT_FALSE(state.boolProcessing);
 
-            state.grid = board(rows);
-            moveWith({}, 1);
-            EXPECT_EQ(state.stats.score, 6);
-            EXPECT_TRUE(state.isGameActive());
-        }
+        state.grid = board(rows);
+        moveWith({}, 1);
+        EXPECT_EQ(state.stats.score, 6);
+        EXPECT_TRUE(state.isGameActive());
     }
 }
 
-TEST_F(InterruptedMoves, EndGameAndACompletedLevelEndTheGameOnce) {
+TEST_F(InterruptedMoves, BringNoRowOnceTheGameIsToEnd) {
     for (const std::int16_t level : std::array<std::int16_t, 2>{1, 10}) {
         play(GameMode::Strategy, rows);
         skipToLastRowOf(level);
-        const std::string recorded = moveWith({endGame, clickStrip}, 1);
+        EXPECT_TRUE(moveWith({endGame, clickStrip}, 1)
+                        .ends_with(lines(closed + " timer=off result:" + std::to_string(level) + ",6,3,3 " +
+                                         named() + "timer=off menu")));
+        play(GameMode::Strategy, rows);
+        skipToLastRowOf(level);
+        const std::string recorded = moveWith({clickStrip, endGame}, 1);
         for (const std::string once : {"completed:", "result:", "menu"})
             EXPECT_EQ(countOf(once, recorded), 1) << recorded;
         EXPECT_TRUE(isAtMenu());

@@ -7,12 +7,12 @@
 
 #include "base/round_half_even.hpp"
 #include "platform/sdl/x11_window.hpp"
+#include "platform/window.hpp"
 
 namespace quabble {
 namespace {
 
 constexpr double plainDotsPerInch = 96;
-constexpr Size nominalFrame{6, 29};  // what a window manager puts around a window, in all
 
 Rect workArea() {
     SDL_Rect area{};
@@ -56,7 +56,7 @@ double DesktopWindow::scaleOf(const NativeWindow& traits) const {
     if (!x11)
         return 1;
     const Rect area = workArea();
-    const Size frame = traits.borderless ? Size{} : nominalFrame;
+    const Size frame = traits.borderless ? Size{} : Window::nominalFrame;
     return scaleFor(x11->dotsPerInch().value_or(plainDotsPerInch), clientSize_,
                     {area.width() - frame.width, area.height() - frame.height});
 }
@@ -65,8 +65,10 @@ double DesktopWindow::scaleOf(const NativeWindow& traits) const {
 Point DesktopWindow::positionOf(const NativeWindow& traits, const DesktopWindow* owner) const {
     const Size own = size();
     if (traits.position) {
-        const std::int32_t left = traits.position->x + (clientSize_.width - own.width) / 2;
-        return {std::max(left, workArea().left), traits.position->y};
+        SDL_Rect screen{};
+        SDL_GetDisplayBounds(0, &screen);
+        const std::int32_t left = screen.x + traits.position->x + (clientSize_.width - own.width) / 2;
+        return {std::max(left, workArea().left), screen.y + traits.position->y};
     }
     if (owner == nullptr) {
         return {static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED),
