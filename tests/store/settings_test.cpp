@@ -48,6 +48,7 @@ TEST_F(SettingsTest, EveryByteComesBackAsItWasStored) {
     EXPECT_EQ(kept.table(2).names[4], "Zo\xEB \x80");
     kept.settings.solvingData.setScoreTableIndex(3);
     kept.settings.solvingData.setSplashSeen();
+    sql("DELETE FROM entries");
     kept.save(registry);
     EXPECT_EQ(stored("SOLVINGDATA"), "00110300010066778899AABBCCDD\n");
     EXPECT_EQ(stored("NUMWFSF"), "DEADBEEF\n");
