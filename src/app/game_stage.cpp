@@ -11,7 +11,6 @@ namespace {
 constexpr std::int32_t panelLeft = 200;
 constexpr std::int32_t arcadePanelTop = 5;
 constexpr double pointsPoints = 8;
-constexpr double captionPoints = 14;
 
 }  // namespace
 

@@ -12,6 +12,8 @@ namespace quabble {
 // table, from 0 here.
 using ButtonSet = std::vector<ScreenButton>;
 
+constexpr double captionPoints = 14;  // of buttons and labels
+
 // The whole client area.
 ScreenButton layOutBackground(Canvas& canvas);
 

@@ -126,7 +126,7 @@ Task<> MainWindow::timerBlocks_Timer() {
 void MainWindow::enablePause(bool enab) {
     gamePaused_ = enab;
     switchBlockTimer(!enab && app_.game.arcadeActive && app_.game.gameMode == GameMode::Timed);
-    lblPause_.area = Rect::ofSize(0, 0, outerSize().width, outerSize().height);
+    lblPause_.area = Rect::ofSize(0, 0, clientSize().width, clientSize().height);
     lblPause_.visible = enab;
     refresh();
 }

@@ -8,7 +8,6 @@
 namespace quabble {
 namespace {
 
-constexpr double captionPoints = 14;
 constexpr double restingPoints = 10;
 
 std::string_view captionOf(std::uint16_t captionBase, std::size_t i) {

@@ -30,7 +30,7 @@ constexpr std::int32_t defaultTextFormat = -1;  // at the top left
 // right and whose top edge is moved up by `offset` pixels. The format is drawText's, or the default.
 void drawShadowText(const ScreenButton& box, std::int32_t offset, std::string_view text, std::int32_t format);
 
-// The painters below copy from the sprite sheet.
+// The painters below copy from a picture.
 
 // Copies a tile to the cell at (column, row), counted from 0.
 void drawCell(const ScreenButton& box, const Surface& spriteSheet, std::int16_t column, std::int16_t row,

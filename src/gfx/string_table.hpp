@@ -13,6 +13,7 @@ constexpr std::uint16_t tagline = 2;
 constexpr std::uint16_t mainMenuBase = 30;
 constexpr std::uint16_t classicPanelBase = 70;
 constexpr std::uint16_t arcadePanelBase = 80;
+constexpr std::uint16_t scoreViewBase = 90;
 constexpr std::uint16_t ok = 91;
 constexpr std::uint16_t gameOver = 101;
 constexpr std::uint16_t trainingResult = 111;

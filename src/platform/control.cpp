@@ -12,6 +12,9 @@ constexpr Colour focusRing{249, 249, 230};
 
 }  // namespace
 
+Task<> Control::mouseUp(Point) {
+    co_return;
+}
 Task<> Control::keyPress(std::int16_t) {
     co_return;
 }
@@ -33,6 +36,15 @@ void PushButton::paint(Surface& surface, bool hasFocus) const {
     surface.fill(area, buttonFace);
     paintControlEdge(surface, area, hasFocus);
     drawText(surface, area, caption, centredLine, controlInk, font);
+}
+
+Task<> PushButton::mouseDown(Point, bool) {
+    co_return;
+}
+
+Task<> PushButton::mouseUp(Point at) {
+    if (area.contains(at.x, at.y))
+        co_await onClick();
 }
 
 }  // namespace quabble

@@ -26,6 +26,8 @@ class Control {
     virtual Task<> mouseDown(Point at, bool extends) = 0;
     // The pointer moved after a press on the control, and the button is still held.
     virtual void mouseDrag(Point /*at*/) {}
+    // Whoever takes the focus also hears, after a press, where the button was let go.
+    virtual Task<> mouseUp(Point at);
 
     virtual bool takesFocus() const { return false; }
     virtual bool takesText() const { return false; }
@@ -53,7 +55,8 @@ class Label final : public Control {
     Task<> mouseDown(Point, bool) override { return onClick(); }
 };
 
-// A button of the platform's own make. The space key presses it while it has the focus.
+// A button of the platform's own make. It acts when the mouse button is let go over it, so that moving off it
+// takes a press back. The space key presses it while it has the focus.
 class PushButton final : public Control {
  public:
     std::string caption;  // Windows-1252
@@ -61,7 +64,8 @@ class PushButton final : public Control {
     std::function<Task<>()> onClick;
 
     void paint(Surface& surface, bool hasFocus) const override;
-    Task<> mouseDown(Point, bool) override { return onClick(); }
+    Task<> mouseDown(Point at, bool extends) override;
+    Task<> mouseUp(Point at) override;
     bool takesFocus() const override { return true; }
     bool takesKey(std::int16_t key) const override { return key == keys::space; }
     Task<> keyPress(std::int16_t) override { return onClick(); }

@@ -58,7 +58,7 @@ class MessageLoop {
     // When to wake the program at the latest, if no event comes before.
     std::optional<TimePoint> nextDeadline() const;
 
-    // The desktop asks the process to end: the window made last of those that have no owner unloads at once,
+    // The desktop asks the process to end: the window shown last of those that have no owner unloads at once,
     // whatever the program is waiting for.
     void requestEnd();
 

@@ -36,7 +36,7 @@ class Surface {
     void outline(const Rect& area, Colour colour);  // 1 pixel wide, within the rectangle
 
     // Copies the source's pixels from `from` on into the area; `andCopy` combines them with what is there by
-    // a bitwise AND. No line of one surface is copied over itself.
+    // a bitwise AND. A line must not be copied over itself.
     void copy(const Rect& area, const Surface& source, Point from);
     void andCopy(const Rect& area, const Surface& source, Point from);
 

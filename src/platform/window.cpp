@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cmath>
 #include <ranges>
+#include <utility>
 
 namespace quabble {
 
@@ -105,7 +106,10 @@ Task<> Window::handle(InputEvent event) {
                 co_await Form_MouseMove(event.x, event.y);
             break;
         case EventKind::MouseUp:
-            pressed_ = nullptr;
+            if (Control* control = std::exchange(pressed_, nullptr)) {
+                co_await control->mouseUp(at);
+                refresh();
+            }
             break;
         case EventKind::KeyPress:
             co_await pressKey(event.key);

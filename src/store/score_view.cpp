@@ -77,7 +77,7 @@ void ScoreView::drawRow(std::size_t place) {
 }
 
 void ScoreView::drawButton(std::size_t i, bool highlighted) {
-    const auto caption = static_cast<std::uint16_t>(string_ids::ok + i);
+    const auto caption = static_cast<std::uint16_t>(string_ids::scoreViewBase + 1 + i);
     drawLabelledBox(buttons_[i], highlighted ? BoxStyle::Framed : BoxStyle::Plain, highlighted,
                     highlighted ? 6 : 4, loadString(caption));
 }

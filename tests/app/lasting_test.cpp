@@ -49,6 +49,10 @@ TEST(NameEntry, TakesTheNameHoweverItIsClosedAndShowsTheTable) {
         ASSERT_EQ(machine.caption(), "Best Score") << name;
         machine.user.press('x');  // a key is no text by itself
         machine.user.type("Zo\u00EB");
+        machine.user.drag(180, 171, 20, 171);  // a press that is taken back
+        machine.user.drag(20, 171, 180, 171);
+        ASSERT_EQ(machine.caption(), "Best Score") << name;
+        machine.user.press(keys::tab);
         close(machine.user);
         EXPECT_EQ(machine.caption(), "Best Scores - Quabble") << name;
         const HighScoreTable& table = machine.app.highScores.table(1);

@@ -4,6 +4,18 @@
 
 namespace quabble {
 
+void ScriptedUser::drag(float fromX, float fromY, float toX, float toY) {
+    const WindowId window = topWindow();
+    const auto follow = [&](EventKind kind) {
+        if (!frontEnd_.windows().empty() && topWindow() == window)
+            act(kind, toX, toY);
+    };
+    act(EventKind::MouseDown, fromX, fromY);
+    if (fromX != toX || fromY != toY)
+        follow(EventKind::MouseMove);
+    follow(EventKind::MouseUp);
+}
+
 void ScriptedUser::press(std::int16_t key) {
     loop_.post({.window = topWindow(), .kind = EventKind::KeyPress, .key = key});
     loop_.wake();

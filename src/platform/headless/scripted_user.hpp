@@ -15,7 +15,9 @@ class ScriptedUser {
  public:
     ScriptedUser(HeadlessFrontEnd& frontEnd, MessageLoop& loop) : frontEnd_(frontEnd), loop_(loop) {}
 
-    void click(float x, float y) { act(EventKind::MouseDown, x, y); }
+    void click(float x, float y) { drag(x, y, x, y); }
+    // Presses the mouse button at one place and lets go of it at another.
+    void drag(float fromX, float fromY, float toX, float toY);
     void movePointer(float x, float y) { act(EventKind::MouseMove, x, y); }
     void press(std::int16_t key);
     void type(const std::string& utf8);  // in vain where no text is asked for

@@ -3,6 +3,8 @@
 #include <SDL2/SDL.h>
 #include <poll.h>
 
+#include <algorithm>
+
 #include "platform/sdl/x11_window.hpp"
 
 namespace quabble {
@@ -22,6 +24,10 @@ DesktopWait::~DesktopWait() {
 // connection, which kills the program when the window has been closed before the server gets to it.
 void DesktopWait::sleep(SDL_Window* window, std::optional<Clock::duration> longest) const {
     if (const auto x11 = X11Window::of(window)) {
+        // An input method may speak to SDL by another way than the X server.
+        constexpr Clock::duration inputMethodPatience = milliseconds(50);
+        if (SDL_IsTextInputActive() != SDL_FALSE)
+            longest = std::min(longest.value_or(inputMethodPatience), inputMethodPatience);
         pollfd waiting{x11->connection(), POLLIN, 0};
         const auto time = std::chrono::nanoseconds(longest.value_or(Clock::duration::zero())).count();
         const timespec end{time / 1'000'000'000, time % 1'000'000'000};

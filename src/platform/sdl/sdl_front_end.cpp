@@ -4,8 +4,10 @@
 
 #include <algorithm>
 #include <csignal>
+#include <cstdio>
 #include <cstring>
 #include <filesystem>
+#include <utility>
 
 #include "platform/sdl/detached_process.hpp"
 #include "platform/sdl/sdl_events.hpp"
@@ -70,6 +72,8 @@ void SdlFrontEnd::run(MessageLoop& loop) {
 
 // Blocks until something has happened or the program's wait is over, then posts all that has happened.
 void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
+    for (const WindowId window : std::exchange(unopened_, {}))
+        loop.post({.window = window, .kind = EventKind::CloseButton});
     if (SDL_PollEvent(nullptr) == 0)
         desktopWait_.sleep(windows_.empty() ? nullptr : windows_.begin()->second->sdl(), timeLeft(loop));
     SDL_Event event;
@@ -129,7 +133,13 @@ bool SdlFrontEnd::isMeantForItsWindow(const SDL_Event& event) {
 }
 
 void SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
-    windows_[window] = std::make_unique<DesktopWindow>(traits, find(traits.owner), icons_);
+    auto made = std::make_unique<DesktopWindow>(traits, find(traits.owner), icons_);
+    if (made->sdl() != nullptr) {
+        windows_[window] = std::move(made);
+    } else {
+        std::fprintf(stderr, "Quabble cannot open a window: %s\n", SDL_GetError());
+        unopened_.push_back(window);
+    }
 }
 
 void SdlFrontEnd::showPixels(WindowId window, const Surface& picture) {
@@ -151,7 +161,8 @@ void SdlFrontEnd::setIcons(std::span<const Icon> icons) {
 }
 
 void SdlFrontEnd::showMessageBox(const std::string& title, const std::string& text) {
-    SDL_ShowSimpleMessageBox(SDL_MESSAGEBOX_ERROR, title.c_str(), text.c_str(), nullptr);
+    if (SDL_ShowSimpleMessageBox(SDL_MESSAGEBOX_ERROR, title.c_str(), text.c_str(), nullptr) != 0)
+        std::fprintf(stderr, "%s\n", text.c_str());
 }
 
 void SdlFrontEnd::openDocument(const std::string& document, const std::string& folder) {

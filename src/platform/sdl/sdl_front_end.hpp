@@ -53,6 +53,7 @@ class SdlFrontEnd final : public FrontEnd {
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
     std::vector<Icon> icons_;
+    std::vector<WindowId> unopened_;  // for want of a place on the desktop; they close at once
     DesktopWait desktopWait_;
     HeldKeys heldKeys_;
     bool textIsMeant_ = true;  // what the key that was pressed last types
