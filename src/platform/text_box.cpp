@@ -13,10 +13,9 @@ constexpr Colour selected{62, 105, 214};
 
 }  // namespace
 
-void TextBox::setText(std::string text) {
-    text_ = std::move(text);
-    caret_ = anchor_ = text_.size();
-    scrollToCaret();
+void TextBox::clear() {
+    text_.clear();
+    moveCaret(0, false);
 }
 
 void TextBox::paint(Surface& surface, bool hasFocus) const {
@@ -149,6 +148,7 @@ std::string TextBox::selection() const {
 
 void TextBox::replaceSelection(std::string_view with) {
     const auto [first, last] = std::minmax(caret_, anchor_);
+    with = with.substr(0, maxLength - (text_.size() - (last - first)));
     text_.replace(first, last - first, with);
     moveCaret(first + with.size(), false);
 }

@@ -18,9 +18,11 @@ class TextBox final : public Control {
 
     Font font;
 
+    // The most characters that the box holds; what is typed or pasted beyond them is left out.
+    static constexpr std::size_t maxLength = 32767;
+
     const std::string& text() const { return text_; }
-    // Replaces the text; the caret is then at its end.
-    void setText(std::string text);
+    void clear();
 
     // The caret's place and the other end of the selection, in characters from the start.
     std::size_t caret() const { return caret_; }

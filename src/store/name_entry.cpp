@@ -51,7 +51,7 @@ void NameEntry::Form_Load() {
     drawShadowText(label(22, 44, palette::valueColour), 1, congratulation, text_format::centre);
     canvas().font = font;
     drawShadowText(label(84, 22, palette::highlightColour), 1, "Enter Your Name", defaultTextFormat);
-    txtName_.setText({});
+    txtName_.clear();
     setFocus(&txtName_);
 }
 

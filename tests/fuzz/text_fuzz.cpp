@@ -29,9 +29,9 @@ void requireTemplate(const std::string& text) {
     assert(text.find('|') != std::string::npos || filled == text);
 }
 
-void requireSound(TextBox& box, Surface& surface) {
+void requireSound(const TextBox& box) {
     assert(box.caret() <= box.text().size() && box.anchor() <= box.text().size());
-    box.paint(surface, true);
+    assert(box.text().size() <= TextBox::maxLength);
 }
 
 }  // namespace
@@ -43,7 +43,6 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     TextBox box(frontEnd);
     box.font = {Typeface::Sans, 11, false};
     box.area = Rect::ofSize(3, 3, 100, 28);
-    Surface surface(106, 34);
     for (std::size_t i = 0; i < size;) {
         const std::uint8_t what = data[i++];
         if (what < 96) {
@@ -63,7 +62,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
             else
                 box.textInput(text);
         }
-        requireSound(box, surface);
+        requireSound(box);
     }
+    Surface surface(106, 34);
+    box.paint(surface, true);
     return 0;
 }

@@ -123,6 +123,21 @@ TEST(TextBox, KeepsTheCaretOfALongTextInSightAndFollowsTheMouse) {
     EXPECT_NEAR(caretColumn(box), 29, 3) << "what fits is seen from its start";
 }
 
+TEST(TextBox, LeavesOutWhatItCannotHold) {
+    HeadlessFrontEnd frontEnd("");
+    TextBox box(frontEnd);
+    box.textInput("0123456789");
+    for (int i = 0; i < 40; ++i) {
+        for (const EditCommand command : {SelectAll, Copy, End, Paste})
+            box.edit(command, false);
+    }
+    EXPECT_EQ(box.text().size(), TextBox::maxLength);
+    box.edit(Left, true);
+    box.textInput("ab");
+    EXPECT_EQ(box.text().size(), TextBox::maxLength);
+    EXPECT_EQ(box.text().back(), 'a') << "in the place of the one marked";
+}
+
 TEST(TextBox, MarksWhatIsSelected) {
     HeadlessFrontEnd frontEnd("");
     TextBox box(frontEnd);
