@@ -8,6 +8,7 @@
 #include "platform/sdl/x11_window.hpp"
 
 namespace quabble {
+
 DesktopWait::DesktopWait() {
     sigset_t ends;
     sigemptyset(&ends);

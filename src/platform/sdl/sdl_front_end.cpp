@@ -46,7 +46,8 @@ std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
     X11Window::outliveErrors();
     SDL_EnableScreenSaver();
     SDL_StopTextInput();
-    std::signal(SIGHUP, passOnHangUp);
+    if (std::signal(SIGHUP, passOnHangUp) == SIG_IGN)
+        std::signal(SIGHUP, SIG_IGN);  // as nohup wishes
     return std::unique_ptr<SdlFrontEnd>(new SdlFrontEnd);
 }
 
