@@ -92,11 +92,11 @@ void Magnifier::show(const Surface& picture, std::uint32_t* pixels, std::ptrdiff
         }
         const Mix& mix = rows_[static_cast<std::size_t>(y)];
         const std::uint32_t* first = widened(picture, mix.first).pixels.data();
-        const std::uint32_t* second = widened(picture, mix.second).pixels.data();
-        if (first == second) {
+        if (mix.first == mix.second) {
             std::memcpy(line, first, width * sizeof(std::uint32_t));
             continue;
         }
+        const std::uint32_t* second = widened(picture, mix.second).pixels.data();
         for (std::size_t x = 0; x < width; ++x)
             line[x] = mixed(first[x], second[x], mix.weight);
     }
