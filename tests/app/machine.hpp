@@ -2,10 +2,9 @@
 
 #include <stb/stb_image_write.h>
 
-#include <filesystem>
-#include <random>
 #include <set>
 
+#include "../support/temporary_folder.hpp"
 #include "app/program.hpp"
 #include "gfx/painters.hpp"
 #include "platform/headless/scripted_user.hpp"
@@ -39,10 +38,7 @@ inline bool isFlat(const Surface& picture, const Rect& area) {
 }
 
 // The program's folder with the sheet in it; it goes with the process.
-struct ProgramFolder {
-    std::filesystem::path path =
-        std::filesystem::temp_directory_path() / ("quabble" + std::to_string(std::random_device{}()));
-
+struct ProgramFolder : TemporaryFolder {
     ProgramFolder() {
         Surface picture(400, 838);
         for (std::int16_t tile = 0; tile < tiles::count; ++tile)
@@ -50,10 +46,8 @@ struct ProgramFolder {
         picture.fill(Rect::ofSize(0, 28, 28, 28), maskColour);
         picture.fill(Rect::ofSize(274, 29, 30, 241), fullGaugeColour);
         picture.fill(Rect::ofSize(0, 338, 400, 500), {90, 10, 130});
-        std::filesystem::create_directory(path);
         stbi_write_bmp((path / "ALLPICDATA.BMP").c_str(), 400, 838, 3, bytesOf(picture).data());
     }
-    ~ProgramFolder() { std::filesystem::remove_all(path); }
 };
 inline const ProgramFolder programFolder;
 

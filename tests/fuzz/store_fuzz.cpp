@@ -1,14 +1,13 @@
 // Feeds any bytes to the settings: as the registry's file itself, and as values of a sound registry. The
 // first byte says which. What was loaded is saved and loaded again.
 
-#include <unistd.h>
-
 #include <cassert>
 #include <cstdio>
 #include <fstream>
 #include <span>
 #include <string>
 
+#include "../support/temporary_folder.hpp"
 #include "platform/headless/headless_front_end.hpp"
 #include "store/settings_store.hpp"
 
@@ -41,7 +40,8 @@ void requireRoundTrip(Registry& registry) {
 }
 
 void tryAsFile(std::span<const unsigned char> bytes) {
-    const std::string path = "/tmp/quabble_store_fuzz_" + std::to_string(getpid());
+    static const TemporaryFolder folder;
+    const std::string path = folder.path / "registry.db";
     std::ofstream(path, std::ios::binary)
         .write(reinterpret_cast<const char*>(bytes.data()), static_cast<std::streamsize>(bytes.size()));
     Registry registry(path);

@@ -8,6 +8,7 @@
 #include <sstream>
 #include <thread>
 
+#include "../support/temporary_folder.hpp"
 #include "platform/sdl/detached_process.hpp"
 #include "platform/sdl/held_keys.hpp"
 
@@ -21,9 +22,8 @@ std::string contentsOf(const std::filesystem::path& file) {
 }
 
 TEST(DetachedProcess, GetsOneArgumentInItsFolderAndLeavesNothingBehind) {
-    const auto folder =
-        std::filesystem::temp_directory_path() / ("quabble_detached_" + std::to_string(getpid()));
-    std::filesystem::create_directory(folder);
+    const TemporaryFolder temporary;
+    const auto& folder = temporary.path;
     std::ofstream(folder / "tell")
         << "#!/bin/sh\nprintf '%s|%s|' \"$#\" \"$1\" >told.new\npwd >>told.new\nmv told.new told\n";
     std::filesystem::permissions(folder / "tell", std::filesystem::perms::owner_all);
@@ -37,7 +37,6 @@ TEST(DetachedProcess, GetsOneArgumentInItsFolderAndLeavesNothingBehind) {
     startDetached({"no-such-program", "x"}, folder.string());
     startDetached({(folder / "tell").string()}, "/no/such/folder");
     EXPECT_TRUE(waitpid(-1, nullptr, WNOHANG) == -1 && errno == ECHILD) << "a child is left to wait for";
-    std::filesystem::remove_all(folder);
 }
 
 TEST(HeldKeys, AKeyHeldSinceAnotherWindowHadTheFocusIsNotHeard) {

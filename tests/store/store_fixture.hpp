@@ -10,6 +10,7 @@
 #include <iterator>
 #include <string>
 
+#include "../support/temporary_folder.hpp"
 #include "platform/headless/headless_front_end.hpp"
 #include "store/settings_store.hpp"
 
@@ -30,9 +31,6 @@ struct Kept {
 // A folder of its own for each test, and a look into the file that is independent of the registry.
 class StoreFixture : public ::testing::Test {
  protected:
-    StoreFixture() { std::filesystem::create_directories(folder); }
-    ~StoreFixture() override { std::filesystem::remove_all(folder); }
-
     // Runs SQL on the file; the first column of what it returns, in hexadecimal, a line a row.
     std::string sql(const std::string& statements) const {
         sqlite3* database = nullptr;
@@ -73,8 +71,8 @@ class StoreFixture : public ::testing::Test {
         return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
     }
 
-    const std::filesystem::path folder =
-        std::filesystem::temp_directory_path() / ("quabble_store_" + std::to_string(getpid()));
+    const TemporaryFolder temporary;
+    const std::filesystem::path& folder = temporary.path;
     const std::filesystem::path file = folder / "data" / "quabble" / "registry.db";
     Registry registry{file.string()};
 };
