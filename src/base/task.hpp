@@ -81,13 +81,6 @@ class [[nodiscard]] Task {
     Task() = default;
     explicit Task(Handle handle) : handle_(handle) {}
     Task(Task&& other) noexcept : handle_(std::exchange(other.handle_, {})) {}
-    Task& operator=(Task&& other) noexcept {
-        if (this != &other) {
-            reset();
-            handle_ = std::exchange(other.handle_, {});
-        }
-        return *this;
-    }
     Task(const Task&) = delete;
     Task& operator=(const Task&) = delete;
     ~Task() { reset(); }

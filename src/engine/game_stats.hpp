@@ -14,6 +14,8 @@ struct GameStats {
     // 1 in a classic game; 1 to 10, and 11 once all are done, in an arcade game; 0 before the first.
     std::int16_t level = 0;
     std::int32_t bestScore = 0;  // the mode's best score when the game started
+
+    friend bool operator==(const GameStats&, const GameStats&) = default;
 };
 
 // The points for a cluster of n cells: n (n + 1) / 2.

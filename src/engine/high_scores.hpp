@@ -13,6 +13,8 @@ constexpr std::int16_t highScoreTables = 3;
 struct HighScoreTable {
     std::array<std::int32_t, highScorePlaces> scores{};
     std::array<std::string, highScorePlaces> names{};
+
+    friend bool operator==(const HighScoreTable&, const HighScoreTable&) = default;
 };
 
 // The tables of the three game modes, numbered like the modes from 1.
@@ -26,6 +28,8 @@ class HighScores {
 
     // Puts a score that ranks into its place; the ones below move down and the eighth drops out.
     void insertHighScore(std::int16_t tableIndex, std::int32_t score, std::string name);
+
+    friend bool operator==(const HighScores&, const HighScores&) = default;
 
  private:
     std::array<HighScoreTable, highScoreTables> tables_{};

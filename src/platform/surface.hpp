@@ -40,6 +40,8 @@ class Surface {
     void copy(const Rect& area, const Surface& source, Point from);
     void andCopy(const Rect& area, const Surface& source, Point from);
 
+    friend bool operator==(const Surface&, const Surface&) = default;
+
  private:
     std::size_t index(std::int32_t x, std::int32_t y) const {
         return static_cast<std::size_t>(y) * static_cast<std::size_t>(width_) + static_cast<std::size_t>(x);

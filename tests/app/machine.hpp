@@ -4,15 +4,13 @@
 
 #include <set>
 
-#include "../support/temporary_folder.hpp"
+#include "../engine/board_notation.hpp"
+#include "../support/files.hpp"
 #include "app/program.hpp"
 #include "gfx/painters.hpp"
 #include "platform/headless/scripted_user.hpp"
 
 namespace quabble {
-
-// How a tile is written, by its number; rows of tiles are separated by blanks.
-constexpr std::string_view tileLetters = ".1234#sabcWXYZ";
 
 // The sprite sheet of the tests: every area is flat and has a colour of its own.
 constexpr Colour maskColour{0x55, 0x33, 0x0F};
@@ -83,20 +81,13 @@ struct Machine {
     }
     void closeDialog() { user.press(keys::enter); }
 
-    // Starts a game with rows of tiles at the bottom of an otherwise empty board.
+    // Starts a game on a board of ours.
     void start(int button, std::string_view rows) {
         clickMenu(button);
         setBoard(rows);
     }
     void setBoard(std::string_view rows) {
-        const std::string board(207 - rows.size(), '.');
-        game.grid.recreate(12, 16);
-        game.grid.forEachCell([&](CellPosition place, GridCell& held) {
-            const auto at = static_cast<std::size_t>(13 * place.row + place.column - 14);
-            const auto tile = static_cast<std::int16_t>(tileLetters.find((board + std::string(rows))[at]));
-            const auto kind = tile > 6 ? CellKind::Bomb : tile == 5 ? CellKind::Stone : CellKind::Block;
-            held = {kind, static_cast<std::int16_t>(tile > 6 ? tile - 6 : tile), tile, 0};
-        });
+        game.grid = board(rows);
         ScreenButton box{.surface = &app.frmQuabble().canvas(), .left = 232, .top = cell(1, 1).top};
         box.cellSize = 28;
         drawBoard(box, app.pictures.spriteSheet, game.grid);
@@ -111,18 +102,19 @@ struct Machine {
         const int above = game.gameMode == GameMode::Training ? 9 : 3;
         return Rect::ofSize(204 + column * 28, above + row * 28, 28, 28);
     }
-    std::string seenRows(int rows) {  // the board's last ones, read from the pixels
+    // The board as it is read from the pixels, 12 letters a row; '?' is no tile.
+    std::string seenLetters() {
         std::string seen;
-        for (int i = (16 - rows) * 12; i < 192; ++i) {
+        for (int i = 0; i < 192; ++i) {
             const Rect square = cell(i % 12 + 1, i / 12 + 1);
             std::int16_t tile = 0;
             while (tile < tiles::count && tileColour(tile) != picture().at(square.left, square.bottom - 1))
                 ++tile;
-            seen += seen.size() % 13 == 12 ? " " : "";
             seen += tile < tiles::count ? tileLetters[static_cast<std::size_t>(tile)] : '?';
         }
         return seen;
     }
+    std::string seenBoard() { return boardText(seenLetters()); }
 };
 
 }  // namespace quabble

@@ -2,6 +2,8 @@
 
 #include <bitset>
 #include <functional>
+#include <map>
+#include <ranges>
 
 #include "colour_vision.hpp"
 #include "platform/bitmap_file.hpp"
@@ -46,23 +48,16 @@ class Art : public ::testing::Test {
 
     // The pixels of a tile that are nearer to its darkest than to its brightest, but for the rim of 4.
     std::bitset<784> emblem(int number) const {
-        std::array<double, 784> lightness{};
-        double darkest = 100;
-        double brightest = 0;
-        const Rect face = Rect::ofSize(4, 4, 20, 20);
+        std::map<std::size_t, double> lightness;
         for (int i = 0; i < 784; ++i) {
-            if (!face.contains(i % 28, i / 28))
-                continue;
-            const Colour c = sheet_.at(28 * number + i % 28, i / 28);
-            const double l = labOf(linearOf(c))[0];
-            lightness[static_cast<std::size_t>(i)] = l;
-            darkest = std::min(darkest, l);
-            brightest = std::max(brightest, l);
+            if (Rect::ofSize(4, 4, 20, 20).contains(i % 28, i / 28))
+                lightness[static_cast<std::size_t>(i)] =
+                    labOf(linearOf(sheet_.at(28 * number + i % 28, i / 28)))[0];
         }
+        const auto [darkest, brightest] = std::ranges::minmax(lightness | std::views::values);
         std::bitset<784> pixels;
-        for (std::size_t i = 0; i < 784; ++i)
-            pixels[i] = face.contains(static_cast<int>(i) % 28, static_cast<int>(i) / 28) &&
-                        lightness[i] < (darkest + brightest) / 2;
+        for (const auto& [i, l] : lightness)
+            pixels[i] = l < (darkest + brightest) / 2;
         return pixels;
     }
 

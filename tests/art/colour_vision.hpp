@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <complex>
 #include <numbers>
 
 namespace quabble {
@@ -66,31 +67,14 @@ inline double ciede2000(const Lab& one, const Lab& other) {
     const auto radians = [](double degrees) { return degrees * pi / 180; };
     const auto power7 = [](double c) { return std::pow(c, 7) / (std::pow(c, 7) + std::pow(25.0, 7)); };
     const double meanC = (std::hypot(one[1], one[2]) + std::hypot(other[1], other[2])) / 2;
-    const double g = 0.5 * (1 - std::sqrt(power7(meanC)));
-    const double a1 = (1 + g) * one[1];
-    const double a2 = (1 + g) * other[1];
-    const double c1 = std::hypot(a1, one[2]);
-    const double c2 = std::hypot(a2, other[2]);
-    const auto hue = [](double b, double a) { return a == 0 && b == 0 ? 0 : std::atan2(b, a); };
-    const auto turned = [](double h) { return h < 0 ? h + 2 * pi : h; };
-    const double h1 = turned(hue(one[2], a1));
-    const double h2 = turned(hue(other[2], a2));
-    const bool isGrey = c1 * c2 == 0;
-    double hueStep = h2 - h1;
-    if (std::abs(hueStep) > pi)
-        hueStep += hueStep > 0 ? -2 * pi : 2 * pi;
-    if (isGrey)
-        hueStep = 0;
-    double meanHue = (h1 + h2) / 2;
-    if (isGrey)
-        meanHue = h1 + h2;
-    else if (std::abs(h1 - h2) > pi)
-        meanHue += h1 + h2 < 2 * pi ? pi : -pi;
-    const double lightness = other[0] - one[0];
-    const double chroma = c2 - c1;
-    const double hueDifference = 2 * std::sqrt(c1 * c2) * std::sin(hueStep / 2);
+    const double stretch = 1.5 - 0.5 * std::sqrt(power7(meanC));
+    const std::complex<double> z1(stretch * one[1], one[2]);
+    const std::complex<double> z2(stretch * other[1], other[2]);
+    const double hueStep = std::arg(z2 * std::conj(z1));
+    const double middle = std::arg(z1) + hueStep / 2;
+    const double meanHue = middle < 0 ? middle + 2 * pi : middle;
     const double meanL = (one[0] + other[0]) / 2 - 50;
-    const double meanChroma = (c1 + c2) / 2;
+    const double meanChroma = (std::abs(z1) + std::abs(z2)) / 2;
     const double t = 1 - 0.17 * std::cos(meanHue - radians(30)) + 0.24 * std::cos(2 * meanHue) +
                      0.32 * std::cos(3 * meanHue + radians(6)) - 0.20 * std::cos(4 * meanHue - radians(63));
     const double sl = 1 + 0.015 * meanL * meanL / std::sqrt(20 + meanL * meanL);
@@ -98,9 +82,9 @@ inline double ciede2000(const Lab& one, const Lab& other) {
     const double sh = 1 + 0.015 * meanChroma * t;
     const double bump = (meanHue * 180 / pi - 275) / 25;
     const double rt = -std::sin(radians(60 * std::exp(-bump * bump))) * 2 * std::sqrt(power7(meanChroma));
-    const double dl = lightness / sl;
-    const double dc = chroma / sc;
-    const double dh = hueDifference / sh;
+    const double dl = (other[0] - one[0]) / sl;
+    const double dc = (std::abs(z2) - std::abs(z1)) / sc;
+    const double dh = 2 * std::sqrt(std::abs(z1) * std::abs(z2)) * std::sin(hueStep / 2) / sh;
     return std::sqrt(dl * dl + dc * dc + dh * dh + rt * dc * dh);
 }
 

@@ -1,49 +1,35 @@
 #pragma once
 
-#include <stdexcept>
+#include <algorithm>
+#include <iterator>
 #include <string>
 #include <string_view>
 
-#include "engine/grid_cell.hpp"
 #include "engine/play_grid.hpp"
 
 namespace quabble {
 
-// Boards as text: '.' is an empty cell, '1' to '4' a block, 'a' to 'c' a bomb of colour 1 to 3, 'S' a stone.
-// The rows stand from the top down with a '/' between them. The last is the bottom row: rows left out at the
-// top are empty, and so are cells left out at the right end of a row.
-
-constexpr std::string_view cellLetters = ".1234abcS";
-constexpr GridCell lettersCells[] = {{},
-                                     {CellKind::Block, 1, 1, 0},
-                                     {CellKind::Block, 2, 2, 0},
-                                     {CellKind::Block, 3, 3, 0},
-                                     {CellKind::Block, 4, 4, 0},
-                                     {CellKind::Bomb, 1, 7, 0},
-                                     {CellKind::Bomb, 2, 8, 0},
-                                     {CellKind::Bomb, 3, 9, 0},
-                                     {CellKind::Stone, 5, 5, 0}};
+// Boards as text, each cell by the letter of its tile: '.' is an empty cell, '1' to '4' a block, 'S' a stone
+// and 's' one that is let go, 'a' to 'c' a bomb of colour 1 to 3, 'W' to 'Z' an explosion. The rows stand
+// from the top down with a '/' between them. The last is the bottom row: rows left out at the top are empty,
+// and so are cells left out at the right end of a row.
+constexpr std::string_view tileLetters = ".1234SsabcWXYZ";
 
 inline GridCell cellOf(char letter) {
-    const std::size_t found = cellLetters.find(letter);
-    if (found == std::string_view::npos)
-        throw std::invalid_argument(std::string("not a cell: ") + letter);
-    return lettersCells[found];
+    const auto tile = static_cast<std::int16_t>(tileLetters.find(letter));
+    const auto kind = tile > 6 ? CellKind::Bomb : tile == 5 ? CellKind::Stone : CellKind::Block;
+    return {kind, static_cast<std::int16_t>(tile > 6 ? tile - 6 : tile), tile, 0};
 }
 
 // '?' for a cell that differs from all of them in any field.
 inline char letterOf(const GridCell& cell) {
-    for (std::size_t i = 0; i < cellLetters.size(); ++i) {
-        if (lettersCells[i] == cell)
-            return cellLetters[i];
-    }
-    return '?';
+    const char letter = tileLetters.at(static_cast<std::size_t>(cell.tile));
+    return cell == cellOf(letter) ? letter : '?';
 }
 
 inline GridRow gridRow(std::string_view text) {
     GridRow row(maxGridCols);
-    for (std::size_t i = 0; i < text.size(); ++i)
-        row.at(i) = cellOf(text[i]);
+    std::ranges::transform(text, row.begin(), cellOf);
     return row;
 }
 
@@ -51,42 +37,47 @@ inline GridRow gridRow(std::string_view text) {
 inline PlayGrid board(std::string_view text) {
     PlayGrid grid;
     grid.recreate(maxGridCols, maxGridRows);
-    for (std::int16_t row = maxGridRows;; --row) {
-        const std::size_t slash = text.rfind('/');
-        std::int16_t column = 1;
-        for (const GridCell& cell : gridRow(slash == std::string_view::npos ? text : text.substr(slash + 1)))
-            grid.at({column++, row}) = cell;
-        if (slash == std::string_view::npos)
-            return grid;
-        text = text.substr(0, slash);
+    auto row = static_cast<std::int16_t>(maxGridRows - std::ranges::count(text, '/'));
+    std::int16_t column = 1;
+    for (const char letter : text) {
+        if (letter == '/')
+            ++row, column = 1;
+        else
+            grid.at({column++, row}) = cellOf(letter);
     }
+    return grid;
 }
 
-inline std::string show(const GridRow& row) {
+// The text of letters that stand for all the cells, 12 a row.
+inline std::string boardText(std::string_view letters) {
     std::string text;
-    for (const GridCell& cell : row)
-        text += letterOf(cell);
-    return text.substr(0, text.find_last_not_of('.') + 1);
+    for (std::size_t i = 0; i < letters.size(); i += maxGridCols) {
+        const std::string_view row = letters.substr(i, maxGridCols);
+        text += text.empty() ? "" : "/";
+        text += row.substr(0, row.find_last_not_of('.') + 1);
+    }
+    return text;
+}
+
+inline std::string lettersOf(const PlayGrid& grid) {
+    std::string letters;
+    grid.forEachCell([&](CellPosition, const GridCell& cell) { letters += letterOf(cell); });
+    return letters;
 }
 
 inline std::string show(const PlayGrid& grid) {
-    std::string text;
-    for (std::int16_t row = 1; row <= grid.gridRows(); ++row) {
-        GridRow cells;
-        for (std::int16_t column = 1; column <= grid.gridCols(); ++column)
-            cells.push_back(grid.at({column, row}));
-        const std::string line = show(cells);
-        text += text.empty() ? line : "/" + line;
-    }
-    return text;
+    return boardText(lettersOf(grid));
+}
+
+inline std::string show(const GridRow& row) {
+    std::string letters;
+    std::ranges::transform(row, std::back_inserter(letters), letterOf);
+    return boardText(letters);
 }
 
 // The text of a board whose lowest rows hold one letter.
 inline std::string fullRows(int count, char letter) {
-    std::string text(maxGridCols, letter);
-    for (int i = 1; i < count; ++i)
-        text += "/" + std::string(maxGridCols, letter);
-    return text;
+    return boardText(std::string(static_cast<std::size_t>(count * maxGridCols), letter));
 }
 
 }  // namespace quabble

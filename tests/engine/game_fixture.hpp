@@ -3,7 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <array>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -26,16 +26,14 @@ inline int countOf(const std::string& word, const std::string& text) {
     return count;
 }
 
-// Draws one number again and again. At 0.5 every cell of a row is a block, of colour 2 while there are three
-// colours and of colour 4 when there are four.
-class ConstantRandom final : public RandomSource {
- public:
+// Draws 0.5 again and again, or the numbers of a seed. At 0.5 every cell of a row is a block, of colour 2
+// while there are three colours and of colour 4 when there are four.
+struct TestRandom final : RandomSource {
     double next() override {
         ++drawn;
-        return value;
+        return seeded ? seeded->next() : 0.5;
     }
-
-    double value = 0.5;
+    std::optional<SeededRandom> seeded;
     int drawn = 0;
 };
 
@@ -73,13 +71,26 @@ class GameFixture : public ::testing::Test {
         state.rowsEntered = levelTable[level].rowsToComplete - 1;
     }
 
+    // Fills a column from a row to above its bottom cell with two colours by turns.
+    void fillColumn(std::int16_t column, std::int16_t top) {
+        for (std::int16_t row = top; row < maxGridRows; ++row)
+            state.grid.at({column, row}) = cellOf("34"[row % 2]);
+    }
+
     // Clicks the middle of a cell.
     Task<> click(CellPosition place) {
         const BoardArea& area = state.boardArea;
         return game.gameBoardClick(static_cast<std::int16_t>(area.left + place.column * 28 - 14),
                                    static_cast<std::int16_t>(area.top + place.row * 28 - 14));
     }
-    Task<> pushRow() { return pushRowOf(*this); }
+    Task<> pushRow() {
+        const bool accepted = co_await game.putnextRow();
+        rowAccepted = accepted;
+    }
+    Task<> startTask(GameMode mode) {
+        start(mode);
+        co_return;
+    }
 
     // What follows the result when the score enters its table.
     std::string named() const { return "name? scores:" + std::to_string(state.scoreTableIndex) + " "; }
@@ -89,7 +100,7 @@ class GameFixture : public ::testing::Test {
     GameState state;
     HighScores highScores;
     LevelTable levelTable;
-    ConstantRandom random;
+    TestRandom random;
     RecordingStage stage{state};
     Game game{state, highScores, levelTable, random, stage};
     bool rowAccepted = false;  // by the last pushRow
@@ -102,17 +113,7 @@ class GameFixture : public ::testing::Test {
         return [this, place] { return click(place); };
     }
     Action startGame(GameMode mode) {
-        return [this, mode] { return startOf(*this, mode); };
-    }
-
- private:
-    static Task<> startOf(GameFixture& fixture, GameMode mode) {
-        fixture.start(mode);
-        co_return;
-    }
-    static Task<> pushRowOf(GameFixture& fixture) {
-        const bool accepted = co_await fixture.game.putnextRow();
-        fixture.rowAccepted = accepted;
+        return [this, mode] { return startTask(mode); };
     }
 };
 

@@ -1,3 +1,5 @@
+#include <span>
+
 #include "game_fixture.hpp"
 
 namespace quabble {
@@ -25,39 +27,37 @@ class InterruptedMoves : public GameFixture {
     const std::string closed = "board=....3/...23332 present";
 
     // The same with column 12 up to the top row.
-    static std::string fullBoard() {
-        std::string tower = "....3......4/...13......3/..2113321234";
-        for (int i = 4; i <= 16; ++i)
-            tower = (i % 2 == 0 ? "...........3/" : "...........4/") + tower;
-        return tower;
+    void playFull(GameMode mode) {
+        play(mode, std::string(rows) + "...4");
+        fillColumn(12, 1);
     }
+
+    static constexpr std::pair<GameMode, int> moves[] = {{GameMode::Timed, 1},    {GameMode::Timed, 2},
+                                                         {GameMode::Strategy, 1}, {GameMode::Strategy, 2},
+                                                         {GameMode::Training, 1}, {GameMode::Training, 2}};
 };
 
 TEST_F(InterruptedMoves, DropClicksOnTheBoardAndTicks) {
-    for (const GameMode mode : {GameMode::Training, GameMode::Timed}) {
-        for (const int chance : {1, 2}) {
-            play(mode, rows);
-            const std::string undisturbed = moveWith({}, chance);
-            play(mode, rows);
-            state.tickCount = 11;
-            EXPECT_EQ(moveWith({clickCell({6, 16}), tick, clickCell({5, 14})}, chance), undisturbed);
-            EXPECT_EQ(state.tickCount, 11);
-        }
+    for (const auto& [mode, chance] : moves) {
+        play(mode, rows);
+        const std::string undisturbed = moveWith({}, chance);
+        play(mode, rows);
+        state.tickCount = 11;
+        EXPECT_EQ(moveWith({clickCell({6, 16}), tick, clickCell({5, 14})}, chance), undisturbed);
+        EXPECT_EQ(state.tickCount, mode == GameMode::Strategy ? 0 : 11);
     }
 }
 
 TEST_F(InterruptedMoves, EndGameActsOnceAfterThem) {
-    for (const GameMode mode : {GameMode::Training, GameMode::Timed, GameMode::Strategy}) {
-        for (const int chance : {1, 2}) {
-            play(mode, rows);
-            EXPECT_TRUE(
-                moveWith({endGame, endGame}, chance)
-                    .ends_with(lines(closed + " timer=off result:1,6,3,3 " + named() + "timer=off menu")));
-            EXPECT_TRUE(isAtMenu());
-            play(mode, rows);
-            moveWith({}, chance);
-            EXPECT_TRUE(state.isGameActive()) << "the wish to end the game before is still remembered";
-        }
+    for (const auto& [mode, chance] : moves) {
+        play(mode, rows);
+        EXPECT_TRUE(
+            moveWith({endGame, endGame}, chance)
+                .ends_with(lines(closed + " timer=off result:1,6,3,3 " + named() + "timer=off menu")));
+        EXPECT_TRUE(isAtMenu());
+        play(mode, rows);
+        moveWith({}, chance);
+        EXPECT_TRUE(state.isGameActive()) << "the wish to end the game before is still remembered";
     }
     play(GameMode::Training, ".....11");
     stage.inMessages = {{endGame}};
@@ -80,38 +80,28 @@ TEST_F(InterruptedMoves, GoOnWithTheBoardMovedUpByTheStrip) {
     EXPECT_FALSE(state.boolProcessing);
 }
 
-TEST_F(InterruptedMoves, GiveUpWhenTheStripCompletesTheLevel) {
-    for (const GameMode mode : {GameMode::Timed, GameMode::Strategy}) {
-        for (const int chance : {1, 2}) {
-            play(mode, rows);
-            skipToLastRowOf(1);
-            EXPECT_TRUE(moveWith({clickStrip}, chance).ends_with(lines("gauge=0 level=2 present present")));
-            EXPECT_EQ(show(state.grid), fullRows(5, '2'));
-            EXPECT_EQ(state.rowsEntered, 0);
-            EXPECT_TRUE(state.arcadeActive && !state.boolProcessing);
-        }
-    }
-}
-
-TEST_F(InterruptedMoves, GiveUpWhenTheStripEndsTheGame) {
-    for (const GameMode mode : {GameMode::Timed, GameMode::Strategy}) {
-        for (const int chance : {1, 2}) {
-            play(mode, fullBoard());
-            EXPECT_TRUE(moveWith({clickStrip}, chance)
-                            .ends_with(lines("result:1,6,3,3 " + named() + "timer=off menu")));
-            EXPECT_TRUE(isAtMenu());
-            play(mode, rows);
-            skipToLastRowOf(10);
-            EXPECT_TRUE(moveWith({clickStrip}, chance)
-                            .ends_with(lines("result:11,6,0,0 " + named() + "timer=off menu present")));
-            EXPECT_TRUE(isAtMenu());
-        }
+TEST_F(InterruptedMoves, GiveUpWhenTheStripEndsTheLevelOrTheGame) {
+    for (const auto& [mode, chance] : std::span(moves).first(4)) {
+        play(mode, rows);
+        skipToLastRowOf(1);
+        EXPECT_TRUE(moveWith({clickStrip}, chance).ends_with(lines("gauge=0 level=2 present present")));
+        EXPECT_EQ(show(state.grid), fullRows(5, '2'));
+        EXPECT_TRUE(state.rowsEntered == 0 && state.arcadeActive && !state.boolProcessing);
+        play(mode, rows);
+        skipToLastRowOf(10);
+        EXPECT_TRUE(moveWith({clickStrip}, chance)
+                        .ends_with(lines("result:11,6,0,0 " + named() + "timer=off menu present")));
+        EXPECT_TRUE(isAtMenu());
+        playFull(mode);
+        EXPECT_TRUE(
+            moveWith({clickStrip}, chance).ends_with(lines("result:1,6,3,3 " + named() + "timer=off menu")));
+        EXPECT_TRUE(isAtMenu());
     }
 }
 
 TEST_F(InterruptedMoves, LeaveAGameStartedMeanwhileAlone) {
     for (const GameMode mode : {GameMode::Training, GameMode::Timed, GameMode::Strategy}) {
-        play(GameMode::Strategy, fullBoard());
+        playFull(GameMode::Strategy);
         const std::string recorded = moveWith({clickStrip, startGame(mode)}, 1);
         EXPECT_EQ(countOf("result:", recorded), 1);
         const std::string lastOfStart = mode == GameMode::Training ? "present present" : "level=1 present";
@@ -128,7 +118,7 @@ TEST_F(InterruptedMoves, LeaveAGameStartedMeanwhileAlone) {
 }
 
 TEST_F(InterruptedMoves, BringNoRowOnceTheGameIsToEnd) {
-    for (const std::int16_t level : std::array<std::int16_t, 2>{1, 10}) {
+    for (const std::int16_t level : {std::int16_t{1}, lastLevel}) {
         play(GameMode::Strategy, rows);
         skipToLastRowOf(level);
         EXPECT_TRUE(moveWith({endGame, clickStrip}, 1)

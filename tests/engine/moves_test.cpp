@@ -39,13 +39,10 @@ TEST_F(Moves, EveryGameStartsClean) {
             EXPECT_EQ(stage.takeLines(), lines(c.before + "board=" + fullRows(c.rows, '2') + c.after));
             EXPECT_EQ(show(state.nextRow), fullRows(1, '2'));
             EXPECT_EQ(random.drawn, 2 * 12 * c.rows);
-            EXPECT_EQ(state.classicActive, c.mode == GameMode::Training);
-            EXPECT_EQ(state.arcadeActive, c.mode != GameMode::Training);
+            const bool isTraining = c.mode == GameMode::Training;
+            EXPECT_TRUE(state.classicActive == isTraining && state.arcadeActive != isTraining);
             EXPECT_FALSE(state.mainMenuActive);
-            EXPECT_EQ(state.stats.level, 1);
-            EXPECT_EQ(state.stats.score, 0);
-            EXPECT_EQ(state.stats.bestScore, c.bestScore);
-            EXPECT_EQ(state.stats.blocksCleared + state.stats.largestCluster, 0);
+            EXPECT_EQ(state.stats, (GameStats{.level = 1, .bestScore = c.bestScore}));
 
             run(click({12, 16}));
             EXPECT_EQ(state.stats.score, 12 * c.rows * (12 * c.rows + 1) / 2);

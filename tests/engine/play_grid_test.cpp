@@ -9,20 +9,13 @@ namespace quabble {
 namespace {
 
 TEST(PlayGrid, OccupiedCellsMoveAsFarAsTheyCan) {
-    struct Case {
-        std::string name, before;
-        Direction direction;
-        std::string after;
-    };
-    const std::string scattered = "1S.3//.a2/..4";
-    const Case cases[] = {{"down", scattered, Direction::Down, ".S2/1a43"},
-                          {"right", scattered, Direction::Right, ".........1S3//..........a2/...........4"},
-                          {"left", scattered, Direction::Left, "1S3//a2/4"},
-                          {"up", "////////////..1//.a/1.2", Direction::Up, "1a1/..2//////////////"}};
-    for (const Case& c : cases) {
-        PlayGrid grid = board(c.before);
-        grid.dropBlocks(c.direction);
-        EXPECT_EQ(show(grid), c.after) << c.name;
+    for (const auto& [direction, after] : {std::pair<Direction, std::string>{Direction::Down, ".S2/1a43"},
+                                           {Direction::Right, ".........1S3//..........a2/...........4"},
+                                           {Direction::Left, "1S3//a2/4"},
+                                           {Direction::Up, "1S23/.a4" + std::string(14, '/')}}) {
+        PlayGrid grid = board("1S.3//.a2/..4");
+        grid.dropBlocks(direction);
+        EXPECT_EQ(show(grid), after);
     }
 }
 

@@ -18,13 +18,20 @@ using Place = std::pair<int, int>;
 using Places = std::set<Place>;
 using Board = std::map<Place, char>;
 
-inline Board read(const PlayGrid& grid) {
+// From 12 letters a row.
+inline Board read(std::string_view letters) {
     Board board;
-    grid.forEachCell([&](CellPosition place, const GridCell& cell) {
-        if (letterOf(cell) != '.')
-            board[{place.column, place.row}] = letterOf(cell);
-    });
+    int i = 0;
+    for (const char letter : letters) {
+        if (letter != '.')
+            board[{i % 12 + 1, i / 12 + 1}] = letter;
+        ++i;
+    }
     return board;
+}
+
+inline Board read(const PlayGrid& grid) {
+    return read(lettersOf(grid));
 }
 
 inline int colourOf(char letter) {
@@ -33,28 +40,16 @@ inline int colourOf(char letter) {
     return letter >= 'a' ? letter - 'a' + 1 : letter - '0';
 }
 
-inline Places placesOfColour(const Board& board, int colour) {
-    Places places;
-    for (const auto& [place, letter] : board) {
-        if (colourOf(letter) == colour)
-            places.insert(place);
-    }
-    return places;
-}
-
-inline void reach(Place place, const Places& colour, Places& reached) {
-    if (!colour.contains(place) || !reached.insert(place).second)
+inline void reach(const Board& board, int colour, Place place, Places& reached) {
+    if (!board.contains(place) || colourOf(board.at(place)) != colour || !reached.insert(place).second)
         return;
-    const auto [column, row] = place;
-    reach({column, row - 1}, colour, reached);
-    reach({column, row + 1}, colour, reached);
-    reach({column - 1, row}, colour, reached);
-    reach({column + 1, row}, colour, reached);
+    for (const auto& [x, y] : {Place{0, -1}, {0, 1}, {-1, 0}, {1, 0}})
+        reach(board, colour, {place.first + x, place.second + y}, reached);
 }
 
 inline Places cluster(const Board& board, Place place) {
     Places reached;
-    reach(place, placesOfColour(board, colourOf(board.at(place))), reached);
+    reach(board, colourOf(board.at(place)), place, reached);
     return reached;
 }
 
@@ -96,7 +91,7 @@ inline Board stacked(const Piles& piles) {
     Board board;
     for (const auto& [column, letters] : piles) {
         for (std::size_t i = 0; i < letters.size(); ++i)
-            board[{column, 16 - static_cast<int>(i)}] = letters[i];
+            board.emplace(Place{column, 16 - static_cast<int>(i)}, letters[i]);
     }
     return board;
 }
@@ -144,7 +139,8 @@ struct Game {
         }
         const bool isBomb = letter >= 'a';
         if (isBomb) {
-            board = closed(fallen(without(board, placesOfColour(board, colourOf(letter)))));
+            std::erase_if(board, [&](const auto& cell) { return colourOf(cell.second) == colourOf(letter); });
+            board = closed(fallen(board));
             release();
         } else if (reached.size() >= 3) {
             remove(reached);

@@ -7,7 +7,7 @@
 #include <span>
 #include <string>
 
-#include "../support/temporary_folder.hpp"
+#include "../support/files.hpp"
 #include "platform/headless/headless_front_end.hpp"
 #include "store/settings_store.hpp"
 
@@ -35,8 +35,7 @@ void requireRoundTrip(Registry& registry) {
     const Store again = load(registry);
     assert(again.settings.solvingData.bytes == loaded.settings.solvingData.bytes);
     assert(again.settings.soundOptions == loaded.settings.soundOptions);
-    for (std::int16_t table = 1; table <= highScoreTables; ++table)
-        assert(again.highScores.table(table).scores == loaded.highScores.table(table).scores);
+    assert(again.highScores == loaded.highScores);
 }
 
 void tryAsFile(std::span<const unsigned char> bytes) {

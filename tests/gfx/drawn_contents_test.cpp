@@ -7,7 +7,6 @@
 #include "gfx/result_dialog.hpp"
 #include "gfx/sprite_sheet.hpp"
 #include "gfx/string_table.hpp"
-#include "pictures.hpp"
 #include "platform/headless/scripted_user.hpp"
 
 namespace quabble {
@@ -35,7 +34,7 @@ TEST_F(Painters, ClipEachCopyOfATextToItsOwnRectangle) {
         drawLabelledBox(box, BoxStyle::Plain, label, 7, label ? text : "");
         if (!label)
             drawShadowText(box, 7, text, format);
-        EXPECT_TRUE(same(drawn.picture, expected.picture)) << format;
+        EXPECT_TRUE(drawn.picture == expected.picture) << format;
     }
 }
 
@@ -48,7 +47,7 @@ TEST_F(Painters, CopyTheTilesOfTheBoardAndTheWaitingRow) {
         expected.picture.copy(square, sheet, {28 * cell.tile, 0});
     });
     drawBoard(box, sheet, grid);
-    EXPECT_TRUE(same(drawn.picture, expected.picture));
+    EXPECT_TRUE(drawn.picture == expected.picture);
     sheet.fill({252, 0, 280, 28}, {0x12, 0x34, 0x56});
     sheet.fill({0, 28, 28, 56}, {0, 0, 0xF0});
     for (const auto& [revealed, hidden] : {std::pair{0, 11}, {4, 7}, {10, 1}, {11, 0}}) {
@@ -57,7 +56,7 @@ TEST_F(Painters, CopyTheTilesOfTheBoardAndTheWaitingRow) {
         for (std::int32_t i = 0; i < hidden; ++i)
             expected.picture.fill(Rect::ofSize(20 + 28 * i, 10, 28, 28), {0, 0, 0x50});
         drawPreviewRow(box, sheet, GridRow(12, GridCell::bomb(3)), static_cast<std::int16_t>(revealed));
-        EXPECT_TRUE(same(drawn.picture, expected.picture)) << revealed;
+        EXPECT_TRUE(drawn.picture == expected.picture) << revealed;
     }
 }
 
@@ -66,11 +65,11 @@ TEST_F(Painters, FillTheGaugeFromTheTopAndCopyNoMoreThanThereIs) {
         expected.picture.copy({20, 10, 90, 10 + 241}, sheet, {246, 29});
         expected.picture.copy({20, 10, 90, 10 + full}, sheet, {274, 29});
         drawGauge(box, sheet, part);
-        EXPECT_TRUE(same(drawn.picture, expected.picture)) << part;
+        EXPECT_TRUE(drawn.picture == expected.picture) << part;
     }
     expected.picture.fill({20, 10, 25, 15}, {});
     copyPicture(box, Surface(5, 5));
-    EXPECT_TRUE(same(drawn.picture, expected.picture)) << "a picture smaller than its box";
+    EXPECT_TRUE(drawn.picture == expected.picture) << "a picture smaller than its box";
 }
 
 TEST_F(Painters, HaveAStandInForASheetThatCannotBeUsed) {
@@ -152,7 +151,7 @@ TEST_F(Result, ShowsItsLinesWholeAndHighlightsItsButtonUntilItCloses) {
             drawText(expected, front, "OK", 1 + 4 + 32, colour, {Typeface::Sans, 14});
             user.movePointer(x, y);
             EXPECT_EQ(user.top().timesShown, timesShown) << x << "," << y;
-            EXPECT_TRUE(same(user.top().picture, expected)) << x << "," << y;
+            EXPECT_TRUE(user.top().picture == expected) << x << "," << y;
             loop.post({user.topWindow(), over ? KeyPress : MouseDown, x, y, 'o'});
         }
         loop.post({user.topWindow(), way.first, 186.5F, 204.5F, way.second});

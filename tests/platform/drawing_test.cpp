@@ -1,11 +1,42 @@
 #include <gtest/gtest.h>
 
-#include "pictures.hpp"
+#include <functional>
+
 #include "platform/bitmap_file.hpp"
 #include "platform/text.hpp"
 
 namespace quabble {
 namespace {
+
+// A picture in digits: a pixel's value is that of its character.
+Surface pixels(std::string_view digits) {
+    Surface surface = digits.size() == 12 ? Surface(4, 3) : Surface(3, 2);
+    for (std::int32_t y = 0; y < surface.height(); ++y)
+        std::ranges::copy_n(digits.begin() + y * surface.width(), surface.width(), surface.row(y).begin());
+    return surface;
+}
+
+TEST(Drawing, EveryOperationIsClippedToBothPictures) {
+    const Surface source = pixels("123457");
+    const Colour five = colourOf('5');
+    const std::pair<const char*, std::function<void(Surface&)>> cases[] = {
+        {"655665566666", [&](Surface& s) { s.fill({1, 0, 3, 2}, five); }},
+        {"555555555555", [&](Surface& s) { s.fill({-2, -9, 9, 4}, five); }},
+        {"666666666666", [&](Surface& s) { s.fill({3, 2, 1, 0}, five); }},
+        {"555556655555", [&](Surface& s) { s.outline({0, 0, 4, 3}, five); }},
+        {"665666565556", [&](Surface& s) { s.outline({-1, -1, 3, 3}, five); }},
+        {"666666666666", [&](Surface& s) { s.outline({1, 1, 3, 1}, five); }},
+        {"666666665766", [&](Surface& s) { s.copy({0, 2, 2, 3}, source, {1, 1}); }},
+        {"576666666666", [&](Surface& s) { s.copy({-1, -1, 2, 1}, source, {}); }},
+        {"666666126645", [&](Surface& s) { s.copy({2, 1, 9, 9}, source, {}); }},
+        {"666666666612", [&](Surface& s) { s.copy({0, 0, 4, 3}, source, {-2, -2}); }},
+        {"666622664666", [&](Surface& s) { s.andCopy({-1, 1, 9, 9}, source, {}); }}};
+    for (const auto& [expected, draw] : cases) {
+        Surface surface = pixels("666666666666");
+        draw(surface);
+        EXPECT_TRUE(surface == pixels(expected)) << expected;
+    }
+}
 
 TEST(Drawing, ABitmapFileIsReadWholeOrNotAtAll) {
     // 3 x 2 pixels, six bytes between the header and them; the bytes of the pixels are 1, 2, 3 and so on.
@@ -51,7 +82,7 @@ TEST(Drawing, TextIsBrokenCentredAndClipped) {
             Surface expected(120, 90);
             expected.copy(clip, lines, {clip.left, clip.top});
             const char* text = format < 32 ? "Wj \xC4 lines\r\n\nWj \xC4 lines\n" : "Wj \xC4 lines";
-            EXPECT_TRUE(same(written(text, format, area), expected)) << area.left << " " << format;
+            EXPECT_TRUE(written(text, format, area) == expected) << area.left << " " << format;
         }
     }
     EXPECT_NEAR(measureText("012345\x80", {Typeface::SansBold, 14}).width, 7 * 1139 / 2048.0 * 14 * 4 / 3, 1);

@@ -23,18 +23,10 @@ TEST(Scale, FollowsTheDotsPerInchAsFarAsTheWindowFits) {
     EXPECT_EQ(scaled({675, 30}, 1.5), (Size{1012, 45}));
 }
 
-// A picture of which each pixel is of a colour of its own.
-Surface numbered(Size size) {
-    Surface picture(size.width, size.height);
-    for (std::int32_t y = 0; y < size.height; ++y) {
-        for (std::int32_t x = 0; x < size.width; ++x)
-            picture.row(y)[static_cast<std::size_t>(x)] = static_cast<std::uint32_t>(x % 256 << 16 | y % 256);
-    }
-    return picture;
-}
-
 TEST(Magnifier, RepeatsPixelsAtWholeScalesAndMixesNeighboursAtOthers) {
-    const Surface picture = numbered({7, 5});
+    Surface picture(7, 5);  // its red tells the column and its blue the row
+    for (std::int32_t i = 0; i < 35; ++i)
+        picture.row(i / 7)[static_cast<std::size_t>(i % 7)] = static_cast<std::uint32_t>(i % 7 << 16 | i / 7);
     for (const Size& shown : {Size{7, 5}, {14, 10}, {21, 15}, {9, 6}, {10, 8}, {4, 3}}) {
         Surface screen(shown.width + 1, shown.height);
         screen.fill(screen.bounds(), {1, 2, 3});

@@ -3,23 +3,14 @@
 
 #include <cerrno>
 #include <chrono>
-#include <filesystem>
-#include <fstream>
-#include <sstream>
 #include <thread>
 
-#include "../support/temporary_folder.hpp"
+#include "../support/files.hpp"
 #include "platform/sdl/detached_process.hpp"
 #include "platform/sdl/held_keys.hpp"
 
 namespace quabble {
 namespace {
-
-std::string contentsOf(const std::filesystem::path& file) {
-    std::ostringstream text;
-    text << std::ifstream(file).rdbuf();
-    return text.str();
-}
 
 TEST(DetachedProcess, GetsOneArgumentInItsFolderAndLeavesNothingBehind) {
     const TemporaryFolder temporary;
@@ -31,7 +22,7 @@ TEST(DetachedProcess, GetsOneArgumentInItsFolderAndLeavesNothingBehind) {
     startDetached({(folder / "tell").string(), nasty}, folder.string());
     for (int i = 0; i < 500 && !std::filesystem::exists(folder / "told"); ++i)
         std::this_thread::sleep_for(std::chrono::milliseconds(10));
-    EXPECT_EQ(contentsOf(folder / "told"), "1|" + nasty + "|" + folder.string() + "\n");
+    EXPECT_EQ(bytesOf(folder / "told"), "1|" + nasty + "|" + folder.string() + "\n");
     EXPECT_FALSE(std::filesystem::exists(folder / "x") || std::filesystem::exists(folder / "y"));
 
     startDetached({"no-such-program", "x"}, folder.string());

@@ -17,10 +17,10 @@ struct Faults {
     bool unsynced[2] = {};      // of the database and of its journal: written to since the disk had it all
     bool isOutOfOrder = false;  // a power cut could have left neither the old settings nor the new
 
-    int next(const std::function<void()>& half = [] {}) {
+    int take(const std::function<int()>& act, const std::function<void()>& actByHalf = [] {}) {
         if (++step != at)
-            return SQLITE_OK;
-        half();
+            return act();
+        actByHalf();
         if (error == 0)
             _exit(1);
         return error;
@@ -37,17 +37,15 @@ struct FaultyFile {
     static int write(sqlite3_file* file, const void* data, int size, sqlite3_int64 offset) {
         faults.isOutOfOrder |= !isJournal && faults.unsynced[true];
         faults.unsynced[isJournal] = true;
-        const int fault = faults.next([&] { real->xWrite(file, data, size / 2, offset); });
-        return fault != SQLITE_OK ? fault : real->xWrite(file, data, size, offset);
+        return faults.take([&] { return real->xWrite(file, data, size, offset); },
+                           [&] { real->xWrite(file, data, size / 2, offset); });
     }
     static int truncate(sqlite3_file* file, sqlite3_int64 size) {
-        const int fault = faults.next();
-        return fault != SQLITE_OK ? fault : real->xTruncate(file, size);
+        return faults.take([&] { return real->xTruncate(file, size); });
     }
     static int sync(sqlite3_file* file, int how) {
         faults.unsynced[isJournal] = false;
-        const int fault = faults.next();
-        return fault != SQLITE_OK ? fault : real->xSync(file, how);
+        return faults.take([&] { return real->xSync(file, how); });
     }
     static void wrap(sqlite3_file* file) {
         real = file->pMethods;
@@ -61,11 +59,9 @@ struct FaultyFile {
 
 int openFile(sqlite3_vfs*, const char* name, sqlite3_file* file, int flags, int* outFlags) {
     const bool isJournal = (flags & SQLITE_OPEN_MAIN_JOURNAL) != 0;
-    if (const int fault = isJournal ? faults.next() : SQLITE_OK) {
-        file->pMethods = nullptr;
-        return fault;
-    }
-    const int result = realVfs->xOpen(realVfs, name, file, flags, outFlags);
+    const auto open = [&] { return realVfs->xOpen(realVfs, name, file, flags, outFlags); };
+    file->pMethods = nullptr;
+    const int result = isJournal ? faults.take(open) : open();
     if (result == SQLITE_OK && file->pMethods != nullptr)
         isJournal ? FaultyFile<true>::wrap(file) : FaultyFile<false>::wrap(file);
     return result;
@@ -73,14 +69,12 @@ int openFile(sqlite3_vfs*, const char* name, sqlite3_file* file, int flags, int*
 
 int deleteFile(sqlite3_vfs*, const char* name, int syncFolder) {
     faults.isOutOfOrder |= faults.error == 0 && (faults.unsynced[false] || syncFolder == 0);
-    const int fault = faults.next();
-    return fault != SQLITE_OK ? fault : realVfs->xDelete(realVfs, name, syncFolder);
+    return faults.take([&] { return realVfs->xDelete(realVfs, name, syncFolder); });
 }
 
 void injectFaults() {
-    static sqlite3_vfs vfs;
     realVfs = sqlite3_vfs_find(nullptr);
-    vfs = *realVfs;
+    static sqlite3_vfs vfs = *realVfs;
     vfs.zName = "faulty";
     vfs.pNext = nullptr;
     vfs.xOpen = openFile;
@@ -107,17 +101,11 @@ class CrashTest : public StoreFixture {
     }
     // The number, or -1 when not everything says the same.
     int loadNumber() {
-        Kept kept;
+        Kept kept, expected;
         kept.load(registry);
         const std::int16_t number = kept.settings.solvingData.scoreTableIndex();
-        Kept expected;
         fill(expected, number);
-        for (std::int16_t table = 1; table <= 3; ++table) {
-            if (kept.table(table).scores != expected.table(table).scores ||
-                kept.table(table).names != expected.table(table).names)
-                return -1;
-        }
-        return number;
+        return kept.highScores == expected.highScores ? number : -1;
     }
     // How often the file was changed, as SQLite counts it.
     unsigned changes() const {

@@ -5,12 +5,9 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <filesystem>
-#include <fstream>
-#include <iterator>
 #include <string>
 
-#include "../support/temporary_folder.hpp"
+#include "../support/files.hpp"
 #include "platform/headless/headless_front_end.hpp"
 #include "store/settings_store.hpp"
 
@@ -52,12 +49,6 @@ class StoreFixture : public ::testing::Test {
     }
     std::string stored(const std::string& name) const {
         return sql("SELECT hex(data) FROM entries WHERE name = '" + name + "'");
-    }
-    std::string bytesOf(const std::filesystem::path& path) const {
-        if (!std::filesystem::is_regular_file(path))
-            return {};
-        std::ifstream stream(path, std::ios::binary);
-        return {std::istreambuf_iterator<char>(stream), {}};
     }
 
     // Runs work in a process of its own; what it returned, -1 when it crashed.

@@ -2,6 +2,8 @@
 
 #include <cstdlib>
 #include <filesystem>
+#include <fstream>
+#include <iterator>
 #include <stdexcept>
 #include <string>
 
@@ -21,5 +23,13 @@ struct TemporaryFolder {
     TemporaryFolder(const TemporaryFolder&) = delete;
     TemporaryFolder& operator=(const TemporaryFolder&) = delete;
 };
+
+// What is in a file; nothing when it is none.
+inline std::string bytesOf(const std::filesystem::path& file) {
+    if (!std::filesystem::is_regular_file(file))
+        return {};
+    std::ifstream stream(file, std::ios::binary);
+    return {std::istreambuf_iterator<char>(stream), {}};
+}
 
 }  // namespace quabble
