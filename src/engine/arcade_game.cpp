@@ -78,8 +78,9 @@ Task<> Game::clickArcadeCell(CellPosition place) {
         co_return;
     if (bringsRow && state_.gameMode == GameMode::Strategy) {
         co_await stage_.pause(strategyRowPause);
-        const bool goesOn = co_await putnextRow();
-        if (!goesOn || round.isOver())
+        // The row may complete the level; the next one's board then takes part in what follows.
+        const bool accepted = co_await putnextRow();
+        if (!accepted || !state_.arcadeActive)
             co_return;
     }
     co_await releaseExposedStones(noPause);

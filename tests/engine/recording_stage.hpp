@@ -27,6 +27,9 @@ class RecordingStage final : public Stage {
     // Likewise during dialogs.
     std::deque<std::vector<Action>> inDialogs;
 
+    // The board that the level began with, 12 letters a row.
+    std::string boardOfLevel;
+
     // The lines written since they were last asked for.
     std::string takeLines() { return std::exchange(lines_, {}); }
 
@@ -44,7 +47,10 @@ class RecordingStage final : public Stage {
         write("points=", points, "@", place.column, ",", place.row);
     }
     void updateScore() override { write("score=", state_.stats.score); }
-    void displayLevel() override { write("level=", state_.stats.level); }
+    void displayLevel() override {
+        write("level=", state_.stats.level);
+        boardOfLevel = lettersOf(state_.grid);
+    }
     void drawPreviewRow(std::int16_t revealed) override {
         write("strip=", revealed, ":", show(state_.nextRow));
     }

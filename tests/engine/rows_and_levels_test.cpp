@@ -78,6 +78,14 @@ TEST_F(RowsAndLevels, LevelIsCompleteWhenItsLastRowHasEntered) {
     }
 }
 
+TEST_F(RowsAndLevels, NothingIsReleasedOnTheBoardOfAWonGame) {
+    play(GameMode::Strategy, "....111S");
+    skipToLastRowOf(lastLevel);
+    run(click({5, 16}));
+    EXPECT_TRUE(stage.takeLines().ends_with(lines("result:11,6,0,0 " + named() + "timer=off menu present")));
+    EXPECT_TRUE(isAtMenu());
+}
+
 TEST_F(RowsAndLevels, EndGameActsAtOnceAndNothingReachesTheGameBehindTheResult) {
     for (const GameMode mode : {GameMode::Training, GameMode::Timed, GameMode::Strategy}) {
         play(mode, ".....1112S");

@@ -124,9 +124,9 @@ struct Game {
     GameStats stats;
     int rowsEntered = 0;
     bool isOver = false;
-    bool isNewLevel = false;  // whose board is not known yet
 
-    void click(Place place, const std::string& nextRow) {
+    // The board of the next level is what follows when a row completes this one.
+    void click(Place place, const std::string& nextRow, const Board& nextLevel) {
         if (!board.contains(place) || (board.at(place) == 'S' && mode != GameMode::Training))
             return;
         const char letter = board.at(place);
@@ -146,12 +146,12 @@ struct Game {
             remove(reached);
         }
         const bool bringsRow = mode == GameMode::Strategy && (isBomb || reached.size() >= 3);
-        if (!bringsRow || push(nextRow))
+        if (!bringsRow || push(nextRow, nextLevel))
             release();
     }
 
-    // False when the game or the level has ended.
-    bool push(const std::string& nextRow) {
+    // False when the game has ended.
+    bool push(const std::string& nextRow, const Board& nextLevel) {
         isOver = isTopRowOccupied(board);
         if (isOver)
             return false;
@@ -164,8 +164,11 @@ struct Game {
             return true;
         stats.blocksCleared = stats.largestCluster = 0;
         isOver = stats.level++ == 10;
-        isNewLevel = !isOver;
-        return false;
+        if (isOver)
+            return false;
+        rowsEntered = 0;
+        board = nextLevel;
+        return true;
     }
 
  private:

@@ -84,20 +84,19 @@ int RulesModel::playWholeGame(GameMode mode, std::uint64_t seed) {
                      std::to_string(place.second) + " of " + show(state.grid) + ", then " + nextRow);
         if (isArcade && drawBelow(10, player) == 0)  // leave out most of the level
             state.rowsEntered = expected.rowsEntered = 42 + 3 * state.stats.level;
+        const std::int16_t level = state.stats.level;
         if (isArcade && drawBelow(mode == GameMode::Timed ? 3 : 12, player) == 0) {
             run(pushRow());
-            expected.push(nextRow);
+            expected.push(nextRow, model::read(stage.boardOfLevel));
         } else {
             run(click(positionOf(place)));
-            expected.click(place, nextRow);
+            expected.click(place, nextRow, model::read(stage.boardOfLevel));
         }
         stage.takeLines();
-        if (expected.isNewLevel) {
-            expected.isNewLevel = false;
-            expected.rowsEntered = 0;
-            expected.board = model::read(state.grid);
-            EXPECT_EQ(std::ssize(expected.board), 12 * levelTable[state.stats.level].startRows);
-            EXPECT_EQ(expected.board, model::fallen(expected.board));
+        if (state.arcadeActive && state.stats.level > level) {
+            const model::Board fresh = model::read(stage.boardOfLevel);
+            EXPECT_EQ(std::ssize(fresh), 12 * levelTable[state.stats.level].startRows);
+            EXPECT_EQ(fresh, model::fallen(fresh));
         }
         EXPECT_EQ(model::read(state.grid), expected.board);
         EXPECT_EQ(state.stats, expected.stats);
