@@ -1,5 +1,7 @@
 #include "app/app_state.hpp"
 
+#include "gfx/message_dialog.hpp"
+
 namespace quabble {
 
 AppState::AppState(MessageLoop& messageLoop, Registry& userRegistry, std::uint64_t seed)
@@ -33,14 +35,20 @@ void AppState::openDocument(const std::string& document) {
     loop.frontEnd().openDocument(document, loop.frontEnd().executableFolder());
 }
 
-void AppState::load() {
-    loadSettings(settings, highScores, registry, loop.frontEnd());
+StoreResult AppState::load() {
+    const StoreResult result = loadSettings(settings, highScores, registry);
     game.scoreTableIndex = settings.solvingData.scoreTableIndex();
+    return result;
 }
 
-void AppState::save() {
+StoreResult AppState::save() {
     settings.solvingData.setScoreTableIndex(game.scoreTableIndex);
-    saveSettings(settings, highScores, registry, loop.frontEnd());
+    return saveSettings(settings, highScores, registry);
+}
+
+Task<> AppState::tellStoreError(Window* owner) {
+    MessageDialog message(loop, owner, std::string(applicationTitle), " Error Failerd");
+    co_await loop.showModal(message);
 }
 
 }  // namespace quabble

@@ -48,8 +48,11 @@ class AppState {
     void openDocument(const std::string& document);
 
     // The settings as the registry has them, and back.
-    void load();
-    void save();
+    StoreResult load();
+    StoreResult save();
+
+    // Tells the user that the registry could not be opened, in front of the owner, if there is one.
+    Task<> tellStoreError(Window* owner);
 
  private:
     std::unique_ptr<MainWindow> frmQuabble_;

@@ -54,9 +54,21 @@ void MainWindow::Form_Load() {
     app_.game.grid.recreate(12, 15);
 }
 
+// The settings are saved while the window is still there for a message to stand in front of.
+Task<> MainWindow::Form_QueryUnload() {
+    if (app_.save() == StoreResult::NotOpened) {
+        timerBlocks_.setEnabled(false);
+        co_await app_.tellStoreError(this);
+    }
+    unload();
+}
+
 void MainWindow::Form_Unload() {
-    app_.save();
     app_.loop.end();
+}
+
+bool MainWindow::Form_Terminate() {
+    return app_.save() == StoreResult::Done;
 }
 
 // The window's size is fixed. Minimising it by its frame hides a running game as a key does.

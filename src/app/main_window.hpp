@@ -30,7 +30,9 @@ class MainWindow final : public Window, private Stage {
  private:
     // What happens to the window (main_window.cpp).
     void Form_Load() override;
+    Task<> Form_QueryUnload() override;
     void Form_Unload() override;
+    bool Form_Terminate() override;
     void Form_Resize() override;
     Task<> Form_MouseDown(float x, float y) override;
     Task<> Form_MouseMove(float x, float y) override;

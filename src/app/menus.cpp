@@ -53,7 +53,7 @@ Task<> MainWindow::mainMenuClick(std::size_t clickedBtnNum) {
             openHelp();
             break;
         case 8:
-            unload();
+            co_await Form_QueryUnload();
             break;
         default:
             break;

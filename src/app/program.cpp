@@ -19,7 +19,8 @@ std::string withSeparator(std::string folder) {
 Task<> Main(AppState& app) {
     app.loop.frontEnd().setIcons(applicationIcons());
     app.programFolder = withSeparator(app.loop.frontEnd().executableFolder());
-    app.load();
+    if (app.load() == StoreResult::NotOpened)
+        co_await app.tellStoreError(nullptr);
     app.pictures = loadGraphics(app.programFolder);
     Splash splash(app);
     co_await app.loop.showModal(splash);

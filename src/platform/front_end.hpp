@@ -54,9 +54,6 @@ class FrontEnd {
     // Of the first screen.
     virtual Size screenSize() { return {1024, 768}; }
 
-    // Shows a message with an OK button and waits for it.
-    virtual void showMessageBox(const std::string& title, const std::string& text) = 0;
-
     // Opens a file or an address with whatever program the desktop has for it, in the given folder, and comes
     // back at once. Nobody hears of it when that fails.
     virtual void openDocument(const std::string& /*document*/, const std::string& /*folder*/) {}

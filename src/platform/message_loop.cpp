@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <cassert>
-#include <ranges>
 #include <utility>
 
 #include "platform/timer.hpp"
@@ -63,13 +62,12 @@ std::optional<TimePoint> MessageLoop::nextDeadline() const {
     return earliest == Timer::never ? std::nullopt : std::optional(earliest);
 }
 
-void MessageLoop::requestEnd() {
-    const auto main = std::ranges::find_if(windows_ | std::views::reverse, [](const Window* window) {
-        return window->isShown() && !window->isDialog();
-    });
-    if (main != windows_.rend())
-        (*main)->unload();
+bool MessageLoop::requestEnd() {
+    bool kept = true;
+    for (Window* window : windows_)
+        kept = (!window->isShown() || window->Form_Terminate()) && kept;
     end();
+    return kept;
 }
 
 bool MessageLoop::isOver(std::optional<TimePoint> wait) const {

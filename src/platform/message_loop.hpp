@@ -58,9 +58,9 @@ class MessageLoop {
     // When to wake the program at the latest, if no event comes before.
     std::optional<TimePoint> nextDeadline() const;
 
-    // The desktop asks the process to end: the window shown last of those that have no owner unloads at once,
-    // whatever the program is waiting for.
-    void requestEnd();
+    // The process is to end: the program ends at once, whatever it is waiting for, and shows nothing. False
+    // when something that should last could not be kept.
+    bool requestEnd();
 
     bool ended() const { return ended_; }
 

@@ -69,6 +69,10 @@ void Window::minimise() {
     loop_.frontEnd().minimiseWindow(id_);
 }
 
+Task<> Window::Form_QueryUnload() {
+    unload();
+    co_return;
+}
 Task<> Window::Form_MouseDown(float, float) {
     co_return;
 }
@@ -119,7 +123,7 @@ Task<> Window::handle(InputEvent event) {
             editText(event);
             break;
         case EventKind::CloseButton:
-            unload();
+            co_await Form_QueryUnload();
             break;
         case EventKind::Minimised:
             changeState(State::Minimised);

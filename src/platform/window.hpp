@@ -61,7 +61,11 @@ class Window {
     void setFocus(Control* control);
 
     virtual void Form_Load() {}
+    // The user wants the window to close; this unloads it.
+    virtual Task<> Form_QueryUnload();
     virtual void Form_Unload() {}
+    // The process is to end, at once and without a question. False when something could not be kept.
+    virtual bool Form_Terminate() { return true; }
     // The window was minimised or restored.
     virtual void Form_Resize() {}
     virtual Task<> Form_MouseDown(float x, float y);

@@ -74,13 +74,14 @@ void loadTable(const RegistryKey& key, std::int16_t number, HighScoreTable& tabl
     }
 }
 
-void saveTable(RegistryKey& key, std::int16_t number, const HighScoreTable& table) {
-    key.set(scoresName(number), ValueType::Binary, bytesOf(table.scores));
+bool saveTable(RegistryKey& key, std::int16_t number, const HighScoreTable& table) {
+    bool written = key.set(scoresName(number), ValueType::Binary, bytesOf(table.scores));
     for (std::size_t place = 0; place < table.names.size(); ++place) {
         const std::string& name = table.names[place];
         const auto withZero = std::as_bytes(std::span(name.c_str(), name.size() + 1));
-        key.set(playerName(number, place), ValueType::String, withZero);
+        written = key.set(playerName(number, place), ValueType::String, withZero) && written;
     }
+    return written;
 }
 
 // The root key stays open as long as the program's own: it holds the transaction.
@@ -89,12 +90,10 @@ struct OpenStore {
     std::optional<RegistryKey> own;
 };
 
-std::optional<OpenStore> openStore(Registry& registry, FrontEnd& frontEnd) {
+std::optional<OpenStore> openStore(Registry& registry) {
     auto software = registry.openKey("Software");
-    if (!software) {
-        frontEnd.showMessageBox(std::string(applicationTitle), " Error Failerd");
+    if (!software)
         return std::nullopt;
-    }
     const std::string subkey = "Vorlane\\" + std::string(applicationTitle) + "\\" + versionText();
     auto own = software->createKey(subkey, "USERDATA");
     return OpenStore{std::move(*software), std::move(own)};
@@ -112,10 +111,12 @@ void SolvingData::setSplashSeen() {
     writeNumber(std::span<std::byte>(bytes), 2, std::int16_t{1});
 }
 
-void loadSettings(Settings& settings, HighScores& highScores, Registry& registry, FrontEnd& frontEnd) {
-    const auto store = openStore(registry, frontEnd);
-    if (!store || !store->own)
-        return;
+StoreResult loadSettings(Settings& settings, HighScores& highScores, Registry& registry) {
+    const auto store = openStore(registry);
+    if (!store)
+        return StoreResult::NotOpened;
+    if (!store->own)
+        return StoreResult::NotWritten;
     const RegistryKey& key = *store->own;
     key.query("SOLVINGDATA", settings.solvingData.bytes);
     key.query("NUMWFSF", settings.numwfsf);
@@ -123,19 +124,22 @@ void loadSettings(Settings& settings, HighScores& highScores, Registry& registry
         settings.soundOptions.fill(1);
     for (std::int16_t table = 1; table <= highScoreTables; ++table)
         loadTable(key, table, highScores.table(table));
+    return StoreResult::Done;
 }
 
-void saveSettings(const Settings& settings, const HighScores& highScores, Registry& registry,
-                  FrontEnd& frontEnd) {
-    auto store = openStore(registry, frontEnd);
-    if (!store || !store->own)
-        return;
+StoreResult saveSettings(const Settings& settings, const HighScores& highScores, Registry& registry) {
+    auto store = openStore(registry);
+    if (!store)
+        return StoreResult::NotOpened;
+    if (!store->own)
+        return StoreResult::NotWritten;
     RegistryKey& key = *store->own;
-    key.set("SOLVINGDATA", ValueType::Binary, settings.solvingData.bytes);
-    key.set("NUMWFSF", ValueType::Binary, settings.numwfsf);
-    key.set("SOUNDOPTIONS", ValueType::Binary, bytesOf(settings.soundOptions));
+    bool written = key.set("SOLVINGDATA", ValueType::Binary, settings.solvingData.bytes);
+    written = key.set("NUMWFSF", ValueType::Binary, settings.numwfsf) && written;
+    written = key.set("SOUNDOPTIONS", ValueType::Binary, bytesOf(settings.soundOptions)) && written;
     for (std::int16_t table = 1; table <= highScoreTables; ++table)
-        saveTable(key, table, highScores.table(table));
+        written = saveTable(key, table, highScores.table(table)) && written;
+    return written ? StoreResult::Done : StoreResult::NotWritten;
 }
 
 }  // namespace quabble

@@ -5,7 +5,6 @@
 #include <cstdint>
 
 #include "engine/high_scores.hpp"
-#include "platform/front_end.hpp"
 #include "platform/registry.hpp"
 
 namespace quabble {
@@ -32,13 +31,15 @@ struct Settings {
 // The name that an entry gets which the store has none for; its score is then 0.
 constexpr const char* unknownName = "Anononymous";
 
-// Fills the settings and the tables from the registry. Each value that is missing or unreadable has a default
-// of its own; when the registry cannot be opened the user is told and everything stays as it was.
-void loadSettings(Settings& settings, HighScores& highScores, Registry& registry, FrontEnd& frontEnd);
+// What became of the settings. The user is told of a registry that could not be opened, and of nothing else.
+enum class StoreResult { Done, NotOpened, NotWritten };
 
-// Writes the settings and the tables, all or nothing. When the registry cannot be opened the user is told;
-// when something cannot be written nobody is, and what was kept before stays.
-void saveSettings(const Settings& settings, const HighScores& highScores, Registry& registry,
-                  FrontEnd& frontEnd);
+// Fills the settings and the tables from the registry. Each value that is missing or unreadable has a default
+// of its own; when the registry cannot be opened everything stays as it was.
+StoreResult loadSettings(Settings& settings, HighScores& highScores, Registry& registry);
+
+// Writes the settings and the tables, all or nothing: when something cannot be written, what was kept before
+// stays.
+StoreResult saveSettings(const Settings& settings, const HighScores& highScores, Registry& registry);
 
 }  // namespace quabble

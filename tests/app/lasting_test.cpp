@@ -117,6 +117,44 @@ TEST(Splash, ClosesOnItsSecondTickWhateverIsClicked) {
               programFolder.path.string() + "/QB_HELP.HTM in " + programFolder.path.string());
 }
 
+// Where the registry should be lies something else, which stays as it is.
+struct MachineWithoutARegistry : Machine {
+    MachineWithoutARegistry() : Machine(Registry(programFolder.path.string())) {}
+};
+
+TEST(Program, TellsOfARegistryThatCannotBeOpenedAndGoesOn) {
+    MachineWithoutARegistry machine;
+    EXPECT_EQ(machine.user.top().traits.caption, "Quabble") << "nothing else is there before it is read";
+    EXPECT_FALSE(machine.user.top().traits.borderless);
+    EXPECT_EQ(machine.frontEnd.windows().size(), 1U);
+    machine.closeDialog();
+    EXPECT_TRUE(machine.user.top().traits.borderless) << "the splash";
+    machine.user.wait(2s);
+    machine.clickMenu(2);
+    machine.user.clickCloseButton();
+    EXPECT_EQ(machine.user.top().traits.caption, "Quabble");
+    EXPECT_TRUE(machine.hasDialog()) << "the main window is seen behind it";
+    machine.user.wait(1h);
+    EXPECT_EQ(machine.game.rowsEntered, 0) << "the game goes no further";
+    EXPECT_FALSE(machine.loop.ended());
+    machine.closeDialog();
+    EXPECT_TRUE(machine.loop.ended());
+    EXPECT_TRUE(machine.frontEnd.windows().empty());
+}
+
+TEST(Program, EndsInFrontOfItsMessageWhenItIsAskedTo) {
+    MachineWithoutARegistry atStart;
+    EXPECT_TRUE(atStart.loop.requestEnd()) << "nothing has happened yet that should last";
+    EXPECT_TRUE(atStart.loop.ended());
+    MachineWithoutARegistry atClose;
+    atClose.closeDialog();
+    atClose.user.wait(2s);
+    atClose.clickMenu(8);
+    ASSERT_TRUE(atClose.hasDialog());
+    EXPECT_FALSE(atClose.loop.requestEnd()) << "and the program can say so";
+    EXPECT_TRUE(atClose.loop.ended());
+}
+
 // However the program ends after it has shown its main window, the settings are kept; before, they are not.
 TEST(Program, KeepsTheScoresWhenItEndsAndNotBefore) {
     for (const std::string by : {"the desktop", "the close button", "Exit"}) {
@@ -128,7 +166,7 @@ TEST(Program, KeepsTheScoresWhenItEndsAndNotBefore) {
         const auto kept = [&] {
             Settings settings;
             HighScores scores;
-            loadSettings(settings, scores, machine.registry, machine.frontEnd);
+            loadSettings(settings, scores, machine.registry);
             return std::to_string(settings.solvingData.scoreTableIndex()) +
                    std::to_string(std::to_integer<int>(settings.solvingData.bytes[4])) +
                    scores.table(1).names[2];
@@ -136,9 +174,12 @@ TEST(Program, KeepsTheScoresWhenItEndsAndNotBefore) {
         EXPECT_EQ(kept(), "00Anononymous");
         if (by != "the desktop")  // which does not wait for the dialog
             machine.closeDialog();
-        by == "Exit"               ? machine.clickMenu(8)
-        : by == "the close button" ? machine.user.clickCloseButton()
-                                   : machine.loop.requestEnd();
+        if (by == "Exit")
+            machine.clickMenu(8);
+        else if (by == "the close button")
+            machine.user.clickCloseButton();
+        else
+            EXPECT_TRUE(machine.loop.requestEnd());
         EXPECT_TRUE(machine.loop.ended());
         EXPECT_EQ(kept(), "11Zo\xEB \x80");
         Machine next(std::move(machine.registry));

@@ -8,7 +8,6 @@
 #include <string>
 
 #include "../support/files.hpp"
-#include "platform/headless/headless_front_end.hpp"
 #include "store/settings_store.hpp"
 
 namespace quabble {
@@ -20,17 +19,14 @@ struct Store {
 };
 
 Store load(Registry& registry) {
-    HeadlessFrontEnd frontEnd("");
     Store store;
-    loadSettings(store.settings, store.highScores, registry, frontEnd);
+    loadSettings(store.settings, store.highScores, registry);
     return store;
 }
 
 void requireRoundTrip(Registry& registry) {
-    HeadlessFrontEnd frontEnd("");
     const Store loaded = load(registry);
-    saveSettings(loaded.settings, loaded.highScores, registry, frontEnd);
-    if (!frontEnd.messages.empty())
+    if (saveSettings(loaded.settings, loaded.highScores, registry) != StoreResult::Done)
         return;
     const Store again = load(registry);
     assert(again.settings.solvingData.bytes == loaded.settings.solvingData.bytes);

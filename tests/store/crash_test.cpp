@@ -92,12 +92,11 @@ class CrashTest : public StoreFixture {
             kept.table(table).names.fill(number == 0 ? unknownName : "player " + std::to_string(number));
         }
     }
-    // Whether the user was told nothing.
+    // False when the registry could not be opened.
     bool saveNumber(std::int16_t number) {
         Kept kept;
         fill(kept, number);
-        kept.save(registry);
-        return kept.frontEnd.messages.empty();
+        return kept.save(registry) != StoreResult::NotOpened;
     }
     // The number, or -1 when not everything says the same.
     int loadNumber() {

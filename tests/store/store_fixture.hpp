@@ -8,7 +8,6 @@
 #include <string>
 
 #include "../support/files.hpp"
-#include "platform/headless/headless_front_end.hpp"
 #include "store/settings_store.hpp"
 
 namespace quabble {
@@ -17,11 +16,9 @@ namespace quabble {
 struct Kept {
     Settings settings;
     HighScores highScores;
-    HeadlessFrontEnd frontEnd{""};
 
-    void load(Registry& registry) { loadSettings(settings, highScores, registry, frontEnd); }
-    void save(Registry& registry) { saveSettings(settings, highScores, registry, frontEnd); }
-    bool wasTold() const { return frontEnd.messages == std::vector<std::string>{"Quabble:  Error Failerd"}; }
+    StoreResult load(Registry& registry) { return loadSettings(settings, highScores, registry); }
+    StoreResult save(Registry& registry) { return saveSettings(settings, highScores, registry); }
     HighScoreTable& table(std::int16_t number) { return highScores.table(number); }
 };
 

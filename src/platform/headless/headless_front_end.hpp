@@ -31,9 +31,6 @@ class HeadlessFrontEnd final : public FrontEnd {
     void showPixels(WindowId window, const Surface& picture) override;
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
-    void showMessageBox(const std::string& title, const std::string& text) override {
-        messages.push_back(title + ": " + text);
-    }
     void openDocument(const std::string& document, const std::string& folder) override {
         openedDocuments.push_back(document + " in " + folder);
     }
@@ -42,7 +39,6 @@ class HeadlessFrontEnd final : public FrontEnd {
     void setClipboardText(const std::string& text) override { clipboard = text; }
     std::string executableFolder() override { return executableFolder_; }
 
-    std::vector<std::string> messages;         // "title: text" of each message box
     std::vector<std::string> openedDocuments;  // "document in folder"
     std::string clipboard;                     // UTF-8
 

@@ -21,6 +21,11 @@ extern "C" void passOnHangUp(int) {
     std::raise(SIGTERM);
 }
 
+void end(MessageLoop& loop) {
+    if (!loop.requestEnd())
+        std::fputs("Quabble could not save its settings and high scores.\n", stderr);
+}
+
 }  // namespace
 
 std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
@@ -62,7 +67,7 @@ void SdlFrontEnd::run(MessageLoop& loop) {
     X11Window::whenServerGoes([this, &loop] {
         static decltype(windows_) abandoned;
         abandoned.swap(windows_);
-        loop.requestEnd();
+        end(loop);
     });
     while (!loop.ended()) {
         waitForEvents(loop);
@@ -80,7 +85,7 @@ void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
     SDL_Event event;
     while (SDL_PollEvent(&event) != 0) {
         if (event.type == SDL_QUIT) {
-            loop.requestEnd();
+            end(loop);
             return;
         }
         take(event, loop);
@@ -159,11 +164,6 @@ void SdlFrontEnd::minimiseWindow(WindowId window) {
 
 void SdlFrontEnd::setIcons(std::span<const Icon> icons) {
     icons_.assign(icons.begin(), icons.end());
-}
-
-void SdlFrontEnd::showMessageBox(const std::string& title, const std::string& text) {
-    if (SDL_ShowSimpleMessageBox(SDL_MESSAGEBOX_ERROR, title.c_str(), text.c_str(), nullptr) != 0)
-        std::fprintf(stderr, "%s\n", text.c_str());
 }
 
 void SdlFrontEnd::openDocument(const std::string& document, const std::string& folder) {

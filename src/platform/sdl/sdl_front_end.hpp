@@ -34,7 +34,6 @@ class SdlFrontEnd final : public FrontEnd {
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
     void setIcons(std::span<const Icon> icons) override;
-    void showMessageBox(const std::string& title, const std::string& text) override;
     void openDocument(const std::string& document, const std::string& folder) override;
     void setTextInput(WindowId window, std::optional<Rect> area) override;
     std::string clipboardText() override;
