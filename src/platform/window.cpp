@@ -66,7 +66,8 @@ void Window::refresh() {
 }
 
 void Window::minimise() {
-    loop_.frontEnd().minimiseWindow(id_);
+    if (shown_)
+        loop_.frontEnd().minimiseWindow(id_);
 }
 
 Task<> Window::Form_QueryUnload() {
