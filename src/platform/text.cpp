@@ -28,27 +28,34 @@ void paintGlyph(Surface& surface, const Rect& clip, const Glyph& glyph, Point or
     }
 }
 
-void paintLine(Surface& surface, const Rect& clip, std::string_view text, Point topLeft, Colour colour,
-               const Font& font) {
+void paintLine(Surface& surface, const Rect& clip, std::string_view text, double left, std::int32_t top,
+               Colour colour, const Font& font) {
     ScaledFont& scaled = scaledFont(font.face, font.points);
-    const std::int32_t baseline = topLeft.y + scaled.ascent();
-    double pen = topLeft.x;
+    const std::int32_t baseline = top + scaled.ascent();
+    double pen = left;
     for (const char character : text) {
         paintGlyph(surface, clip, scaled.glyph(character, pen), {ScaledFont::wholePixel(pen), baseline},
                    colour);
         pen += scaled.advance(character);
     }
     if (font.underlined) {
-        const Rect line{topLeft.x, baseline + 2, ScaledFont::wholePixel(pen), baseline + 3};
+        const Rect line{ScaledFont::wholePixel(left), baseline + 2, ScaledFont::wholePixel(pen),
+                        baseline + 3};
         surface.fill(line.intersection(clip), colour);
     }
 }
 
-std::int32_t lineWidth(std::string_view text, ScaledFont& font) {
+// The nearest whole pixel. A half always goes the same way, or some shadows would lie nearer to their text
+// than others.
+std::int32_t nearestPixel(double place) {
+    return ScaledFont::wholePixel(place + 0.5);
+}
+
+double lineWidth(std::string_view text, const ScaledFont& font) {
     double width = 0;
     for (const char character : text)
         width += font.advance(character);
-    return ScaledFont::wholePixel(width + 0.5);
+    return width;
 }
 
 // Splits the first line off a text; a line ends at a line feed, with or without a carriage return before it.
@@ -70,20 +77,20 @@ void drawText(Surface& surface, const Rect& area, std::string_view text, std::in
     const bool single = (format & text_format::singleLine) != 0;
     std::int32_t top = area.top;
     if (single && (format & text_format::verticalCentre) != 0)
-        top += (area.height() - scaled.lineHeight()) / 2;
+        top += nearestPixel((area.height() - scaled.lineHeight()) / 2.0);
     while (!text.empty()) {
         const std::string_view line = single ? std::exchange(text, {}) : takeLine(text);
-        std::int32_t left = area.left;
+        double left = area.left;
         if ((format & text_format::centre) != 0)
             left += (area.width() - lineWidth(line, scaled)) / 2;
-        paintLine(surface, clip, line, {left, top}, colour, font);
+        paintLine(surface, clip, line, left, top, colour, font);
         top += scaled.lineHeight();
     }
 }
 
 Size measureText(std::string_view text, const Font& font) {
     ScaledFont& scaled = scaledFont(font.face, font.points);
-    return {lineWidth(text, scaled), scaled.lineHeight()};
+    return {nearestPixel(lineWidth(text, scaled)), scaled.lineHeight()};
 }
 
 }  // namespace quabble

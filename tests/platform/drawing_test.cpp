@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <functional>
 
 #include "platform/bitmap_file.hpp"
@@ -70,22 +71,60 @@ Surface written(const char* text, std::int32_t format, const Rect& area) {
 }
 
 TEST(Drawing, TextIsBrokenCentredAndClipped) {
-    const auto [width, height] = measureText("Wj \xC4 lines", {Typeface::Sans, 14});
+    constexpr const char* line = "Wj \xC4 lines";
+    const std::int32_t height = measureText(line, {Typeface::Sans, 14}).height;
     for (const Rect& area : {Rect{20, 10, 110, 80}, Rect{-4, 10, 86, 200}, Rect{50, 10, 80, 20}}) {
-        const Rect clip = area.intersection({0, 0, 120, 90});
-        const std::int32_t x = area.left + (area.width() - width) / 2, y = 10 + (area.height() - height) / 2;
+        const std::int32_t middle =
+            10 + static_cast<std::int32_t>(std::floor((area.height() - height + 1) / 2.0));
         for (const std::int32_t format : {0, 1, 1 + 4, 1 + 4 + 32}) {
-            Surface lines =
-                written("Wj \xC4 lines", 0, {format == 0 ? area.left : x, format > 32 ? y : 10, 120, 90});
+            // The line alone, with as much room as it needs.
+            Rect room{area.left, format > 32 ? middle : 10, area.right + 200, 90};
+            if (format != 0)
+                room.left -= 200;
+            Surface lines = written(line, format & 1, room);
             if (format < 32)
                 lines.copy({0, 10 + 2 * height, 120, 90}, lines, {0, 10});
+            const Rect clip = area.intersection({0, 0, 120, 90});
             Surface expected(120, 90);
             expected.copy(clip, lines, {clip.left, clip.top});
-            const char* text = format < 32 ? "Wj \xC4 lines\r\n\nWj \xC4 lines\n" : "Wj \xC4 lines";
+            const char* text = format < 32 ? "Wj \xC4 lines\r\n\nWj \xC4 lines\n" : line;
             EXPECT_TRUE(written(text, format, area) == expected) << area.left << " " << format;
         }
     }
     EXPECT_NEAR(measureText("012345\x80", {Typeface::SansBold, 14}).width, 7 * 1139 / 2048.0 * 14 * 4 / 3, 1);
+}
+
+// The middle of what is written on a picture.
+struct Ink {
+    double x = 0;
+    double y = 0;
+
+    explicit Ink(const Surface& surface) {
+        double light = 0;
+        for (std::int32_t row = 0; row < surface.height(); ++row) {
+            for (std::int32_t column = 0; column < surface.width(); ++column) {
+                const double value = surface.at(column, row).green;
+                x += value * (column + 0.5);
+                y += value * (row + 0.5);
+                light += value;
+            }
+        }
+        x /= light;
+        y /= light;
+    }
+};
+
+TEST(Drawing, ACentredTextMovesByHalfOfWhatItsRectangleGrows) {
+    constexpr std::int32_t format = 1 + 4 + 32;
+    EXPECT_NEAR(Ink(written("HOH", format, {10, 20, 110, 50})).x, 60, 0.25);
+    for (const char* text : {"Training", "Timed", "High scores", "Help", "Exit", "OK"}) {
+        const Ink shadow(written(text, format, {10, 20, 110, 50}));
+        for (const std::int32_t offset : {2, 3, 4, 6, 8}) {
+            const Ink front(written(text, format, {10, 20, 110 + offset, 50 - offset}));
+            EXPECT_NEAR(front.x - shadow.x, offset / 2.0, 0.02) << text << " " << offset;
+            EXPECT_NEAR(shadow.y - front.y, (offset + 1) / 2, 0.02) << text << " " << offset;
+        }
+    }
 }
 
 }  // namespace
