@@ -111,5 +111,14 @@ TEST_F(Art, EmblemsStandOutFromBlocksAndBlocksFromThePanel) {
     }
 }
 
+// The strip of the waiting row hangs out of the window's blue, below the panel's last row of pixels.
+TEST_F(Art, ThePanelIsClosedAboveTheStrip) {
+    const Colour windowBlue{62, 105, 214};
+    for (std::int32_t x = 0; x < 400; ++x) {
+        for (std::int32_t y = 494; y < 500; ++y)
+            EXPECT_EQ(sheet_.at(x, 338 + y), windowBlue) << x << ", " << y;
+    }
+}
+
 }  // namespace
 }  // namespace quabble
