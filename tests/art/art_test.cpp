@@ -1,23 +1,49 @@
 #include <gtest/gtest.h>
 
 #include <bitset>
-#include <functional>
 #include <map>
 #include <ranges>
+#include <string>
 
+#include "base/round_half_even.hpp"
 #include "colour_vision.hpp"
 #include "platform/bitmap_file.hpp"
+#include "platform/scaling.hpp"
 
 namespace quabble {
 namespace {
 
 constexpr double leastDifference = 12;  // of CIEDE2000
 constexpr double leastLightnessStep = 8;
-constexpr double leastEmblemDifference = 0.25;  // of a tile's pixels
+constexpr double leastFigureDifference = 0.25;  // of the pixels that are seen
 constexpr double leastContrast = 3;
 
-constexpr Rect tile(int number) {
-    return Rect::ofSize(28 * number, 0, 28, 28);
+constexpr int lastBlock = 4;
+constexpr int stone = 5;
+constexpr int stoneLettingGo = 6;
+constexpr int firstBomb = 7;
+constexpr int lastBomb = 9;
+
+constexpr std::size_t tilePixels = 28 * 28;
+using TilePart = std::bitset<tilePixels>;
+
+// Pixels of a tile that lie within a rectangle.
+TilePart partWithin(const Rect& area) {
+    TilePart part;
+    for (std::size_t i = 0; i < tilePixels; ++i)
+        part[i] = area.contains(static_cast<std::int32_t>(i % 28), static_cast<std::int32_t>(i / 28));
+    return part;
+}
+
+// The iron of a bomb, within its hoop, and what is on it.
+TilePart bombBall() {
+    TilePart part;
+    for (std::size_t i = 0; i < tilePixels; ++i) {
+        const double x = static_cast<double>(i % 28) + 0.5;
+        const double y = static_cast<double>(i / 28) + 0.5;
+        part[i] = std::hypot(x - 12.5, y - 15.8) < 8.5;
+    }
+    return part;
 }
 
 // The picture sheet as it is rendered.
@@ -27,41 +53,53 @@ class Art : public ::testing::Test {
 
     static LinearColour linearOf(Colour c) { return {linear(c.red), linear(c.green), linear(c.blue)}; }
 
-    // The mean light of an area's pixels that are wanted.
-    LinearColour mean(
-        const Rect& area, const std::function<bool(int)>& isWanted = [](int) { return true; }) const {
-        LinearColour sum{};
-        int count = 0;
-        for (int i = 0; i < area.width() * area.height(); ++i) {
-            if (!isWanted(i))
-                continue;
-            const LinearColour c =
-                linearOf(sheet_.at(area.left + i % area.width(), area.top + i / area.width()));
-            for (std::size_t channel = 0; channel < 3; ++channel)
-                sum[channel] += c[channel];
-            ++count;
+    LinearColour light(int tile, std::size_t i) const {
+        const auto pixel = static_cast<std::int32_t>(i);
+        return linearOf(sheet_.at(28 * tile + pixel % 28, pixel / 28));
+    }
+
+    // The pixels that the veil lets through.
+    TilePart opening() const {
+        TilePart part;
+        for (std::size_t i = 0; i < tilePixels; ++i) {
+            const auto pixel = static_cast<std::int32_t>(i);
+            part[i] = sheet_.at(pixel % 28, 28 + pixel / 28) == Colour{255, 255, 255};
         }
-        for (double& channel : sum)
-            channel /= count;
+        return part;
+    }
+
+    // The mean light of a part of a tile, of which only the pixels that are let through shine.
+    LinearColour mean(int tile, const TilePart& part, const TilePart& letThrough) const {
+        LinearColour sum{};
+        for (std::size_t i = 0; i < tilePixels; ++i) {
+            if (!part[i] || !letThrough[i])
+                continue;
+            const LinearColour c = light(tile, i);
+            for (std::size_t channel = 0; channel < 3; ++channel)
+                sum[channel] += c[channel] / static_cast<double>(part.count());
+        }
         return sum;
     }
 
-    // The pixels of a tile that are nearer to its darkest than to its brightest, but for the rim of 4.
-    std::bitset<784> emblem(int number) const {
+    // The pixels of a part that are nearer to its darkest than to its brightest.
+    TilePart darkOf(int tile, const TilePart& part) const {
         std::map<std::size_t, double> lightness;
-        for (int i = 0; i < 784; ++i) {
-            if (Rect::ofSize(4, 4, 20, 20).contains(i % 28, i / 28))
-                lightness[static_cast<std::size_t>(i)] =
-                    labOf(linearOf(sheet_.at(28 * number + i % 28, i / 28)))[0];
+        for (std::size_t i = 0; i < tilePixels; ++i) {
+            if (part[i])
+                lightness[i] = labOf(light(tile, i))[0];
         }
         const auto [darkest, brightest] = std::ranges::minmax(lightness | std::views::values);
-        std::bitset<784> pixels;
+        TilePart pixels;
         for (const auto& [i, l] : lightness)
             pixels[i] = l < (darkest + brightest) / 2;
         return pixels;
     }
 
+    // What there is to see on a tile beside its colour: the emblem of a block, the facets of a stone.
+    TilePart figure(int tile) const { return darkOf(tile, partWithin({4, 4, 24, 24})); }
+
     const Surface sheet_ = loadBitmap(QUABBLE_SHEET).value_or(Surface());
+    const TilePart whole_ = partWithin({0, 0, 28, 28});
 };
 
 TEST(ColourDifference, IsThatOfThePublishedPairs) {
@@ -79,35 +117,91 @@ TEST(ColourDifference, IsThatOfThePublishedPairs) {
         EXPECT_NEAR(ciede2000(p.one, p.other), p.difference, 0.0001);
 }
 
-TEST_F(Art, BlocksStayApartForEverySight) {
-    for (int one = 1; one <= 4; ++one) {
-        for (int other = one + 1; other <= 4; ++other) {
-            const LinearColour a = mean(tile(one));
-            const LinearColour b = mean(tile(other));
-            for (const Sight& sight : sights)
-                EXPECT_GE(ciede2000(labOf(sight(a)), labOf(sight(b))), leastDifference)
-                    << one << " and " << other << ", " << sight.name;
-            const double step = std::abs(labOf(a)[0] - labOf(b)[0]);
-            const double emblems = static_cast<double>((emblem(one) ^ emblem(other)).count()) / 784;
-            EXPECT_TRUE(step >= leastLightnessStep || emblems >= leastEmblemDifference)
-                << one << " and " << other << " in grey: " << step << ", " << emblems;
+// Blocks and stones differ in colour wherever they lie in the open; for the rest another figure is enough.
+TEST_F(Art, TilesStayApartForEverySightBelowTheVeilToo) {
+    for (const TilePart& seen : {whole_, opening()}) {
+        const bool isVeiled = seen != whole_;
+        for (int one = 1; one <= lastBomb; ++one) {
+            for (int other = one + 1; other <= lastBomb; ++other) {
+                const bool isLettingGo = one == stoneLettingGo || other == stoneLettingGo;
+                if (isLettingGo && (isVeiled || one == stone))
+                    continue;
+                const auto figures = static_cast<double>(((figure(one) ^ figure(other)) & seen).count()) /
+                                     static_cast<double>(seen.count());
+                const LinearColour a = mean(one, whole_, seen);
+                const LinearColour b = mean(other, whole_, seen);
+                const std::string pair =
+                    std::to_string(one) + " and " + std::to_string(other) + (isVeiled ? ", veiled, " : ", ");
+                const bool areFiguresEnough = figures >= leastFigureDifference;
+                const bool isToldByColour = !isVeiled && other <= stoneLettingGo;
+                if (isToldByColour || !areFiguresEnough) {
+                    for (const Sight& sight : sights)
+                        EXPECT_GE(ciede2000(labOf(sight(a)), labOf(sight(b))), leastDifference)
+                            << pair << sight.name << ", figures " << figures;
+                }
+                if (other <= stone && !areFiguresEnough) {
+                    EXPECT_GE(std::abs(labOf(a)[0] - labOf(b)[0]), leastLightnessStep) << pair << "in grey";
+                }
+            }
         }
     }
 }
 
-TEST_F(Art, EmblemsStandOutFromBlocksAndBlocksFromThePanel) {
-    const Rect panel = Rect::ofSize(40, 380, 320, 440);
-    for (int number = 1; number <= 4; ++number) {
-        const std::bitset<784> emblemPixels = emblem(number);
-        EXPECT_GE(emblemPixels.count(), 100U) << number << ": large enough to be seen";
-        const auto isEmblem = [&](int i) { return emblemPixels[static_cast<std::size_t>(i)]; };
-        const auto isBody = [&](int i) {
-            return !isEmblem(i) && Rect::ofSize(2, 2, 24, 24).contains(i % 28, i / 28);
+TEST_F(Art, EmblemsStandOutBelowTheVeilToo) {
+    for (const TilePart& seen : {whole_, opening()}) {
+        for (int number = 1; number <= lastBomb; ++number) {
+            if (number == stone || number == stoneLettingGo)
+                continue;
+            const TilePart ball = bombBall();
+            const TilePart dark = number >= firstBomb ? darkOf(number, ball) : figure(number);
+            const TilePart emblem = number >= firstBomb ? ball & ~dark : dark;
+            const TilePart face = number >= firstBomb ? dark : partWithin({2, 2, 26, 26}) & ~dark;
+            EXPECT_GE(emblem.count(), 100U) << number << ": large enough to be seen";
+            EXPECT_GE(contrast(mean(number, emblem, seen), mean(number, face, seen)), leastContrast)
+                << number << (seen == whole_ ? "" : ", veiled");
+        }
+    }
+}
+
+TEST_F(Art, BlocksStandOutFromThePanel) {
+    const LinearColour panel = linearOf(sheet_.at(200, 600));
+    for (int number = 1; number <= lastBlock; ++number) {
+        const LinearColour body = mean(number, partWithin({2, 2, 26, 26}) & ~figure(number), whole_);
+        EXPECT_GE(contrast(body, panel), leastContrast) << number << " and the panel";
+        EXPECT_GE(contrast(body, mean(0, whole_, whole_)), leastContrast) << number << " and an empty cell";
+    }
+}
+
+// A pattern whose repeats are no whole number of the screen's pixels apart beats there.
+TEST_F(Art, TheVeilIsAlikeAllOverAtEveryScale) {
+    Surface veil(28, 28);
+    veil.copy(veil.bounds(), sheet_, {0, 28});
+    for (const bool isAcross : {false, true}) {
+        const auto isAlike = [&](const Surface& shown, std::int32_t from, std::int32_t to) {
+            for (std::int32_t i = 0; i < shown.width(); ++i) {
+                if (isAcross ? shown.at(from, i) != shown.at(to, i) : shown.at(i, from) != shown.at(i, to))
+                    return false;
+            }
+            return true;
         };
-        const LinearColour body = mean(tile(number), isBody);
-        EXPECT_GE(contrast(mean(tile(number), isEmblem), body), leastContrast) << number;
-        EXPECT_GE(contrast(body, mean(panel)), leastContrast) << number << " and the panel";
-        EXPECT_GE(contrast(body, mean(tile(0))), leastContrast) << number << " and an empty cell";
+        // The border left out.
+        const auto repeatsAfter = [&](const Surface& shown, std::int32_t border, std::int32_t distance) {
+            std::int32_t i = border;
+            while (i + distance < shown.width() - border && isAlike(shown, i, i + distance))
+                ++i;
+            return i + distance == shown.width() - border;
+        };
+        std::int32_t distance = 1;
+        while (!repeatsAfter(veil, 3, distance))
+            ++distance;
+        EXPECT_LE(distance, 8) << "it is a pattern";
+        for (const double scale : {1.25, 1.5, 1.75, 2.0, 2.25, 2.5, 2.75, 3.0}) {
+            Surface shown(roundHalfEven(28 * scale), roundHalfEven(28 * scale));
+            Magnifier({28, 28}, {shown.width(), shown.height()})
+                .show(veil, shown.row(0).data(), 4 * std::ptrdiff_t{shown.width()});
+            EXPECT_TRUE(repeatsAfter(shown, roundHalfEven(4 * scale), roundHalfEven(distance * scale)))
+                << scale << (isAcross ? ", across" : ", down");
+        }
     }
 }
 
