@@ -3,55 +3,58 @@
 #include <algorithm>
 #include <utility>
 
+#include "gfx/ok_button.hpp"
 #include "gfx/painters.hpp"
 
 namespace quabble {
 namespace {
 
 constexpr Font messageFont{Typeface::SansBold, 12};
-constexpr Font buttonFont{Typeface::Sans, 11};
 constexpr std::int32_t margin = 30;
+constexpr std::int32_t lineHeight = 24;
 constexpr std::int32_t leastWidth = 260;
-constexpr std::int32_t height = 128;
-constexpr Size button{90, 30};
 
 }  // namespace
 
 MessageDialog::MessageDialog(MessageLoop& loop, Window* owner, std::string title, std::string text)
-    : Window(loop, owner), title_(std::move(title)), text_(std::move(text)) {
-    OKButton_.caption = "OK";
-    OKButton_.font = buttonFont;
-    OKButton_.visible = true;
-    OKButton_.onClick = [this] { return OKButton_Click(); };
-    addControl(OKButton_);
-}
+    : Window(loop, owner), title_(std::move(title)), text_(std::move(text)) {}
 
 void MessageDialog::Form_Load() {
     const std::int32_t width = std::max(leastWidth, measureText(text_, messageFont).width + 2 * margin);
+    const std::int32_t buttonTop = 2 * margin + lineHeight;
     setCaption(title_);
-    setClientSize({width, height});
+    setClientSize({width, buttonTop + okButtonSize.height + margin});
+    canvas().picture.fill(canvas().picture.bounds(), palette::backgroundColour);
+    canvas().font = messageFont;
     const ScreenButton label{.surface = &canvas(),
                              .left = margin,
                              .top = margin,
                              .width = width - 2 * margin,
-                             .height = 24,
+                             .height = lineHeight,
                              .textColour = palette::valueColour};
-    OKButton_.area =
-        Rect::ofSize((width - button.width) / 2, height - button.height - 20, button.width, button.height);
-    canvas().picture.fill(canvas().picture.bounds(), palette::backgroundColour);
-    canvas().font = messageFont;
     drawShadowText(label, 1, text_, text_format::centre);
-    setFocus(&OKButton_);
+    okBox_ = layOutOkButton(canvas(), (width - okButtonSize.width) / 2, buttonTop);
+    drawOkButton(okBox_);
+}
+
+Task<> MessageDialog::Form_MouseDown(float x, float y) {
+    if (hitTest(okBox_, x, y))
+        unload();
+    co_return;
+}
+
+Task<> MessageDialog::Form_MouseMove(float x, float y) {
+    const bool over = hitTest(okBox_, x, y);
+    if (over == okBox_.hovered)
+        co_return;
+    okBox_.hovered = over;
+    drawOkButton(okBox_);
+    refresh();
 }
 
 Task<> MessageDialog::Form_KeyPress(std::int16_t key) {
     if (key == keys::enter || key == keys::escape)
         unload();
-    co_return;
-}
-
-Task<> MessageDialog::OKButton_Click() {
-    unload();
     co_return;
 }
 

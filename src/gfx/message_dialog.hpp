@@ -2,7 +2,7 @@
 
 #include <string>
 
-#include "platform/control.hpp"
+#include "gfx/screen_button.hpp"
 #include "platform/window.hpp"
 
 namespace quabble {
@@ -16,12 +16,13 @@ class MessageDialog final : public Window {
 
  private:
     void Form_Load() override;
+    Task<> Form_MouseDown(float x, float y) override;
+    Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;
-    Task<> OKButton_Click();
 
     std::string title_;  // UTF-8
     std::string text_;   // Windows-1252
-    PushButton OKButton_;
+    ScreenButton okBox_;
 };
 
 }  // namespace quabble

@@ -25,7 +25,7 @@ constexpr Brush backgroundBrush{backgroundColour};
 constexpr Brush viewBrush{backgroundColour};  // the view of the high scores
 constexpr Brush blackBrush{black};
 constexpr Pen lightPen{highlightColour};
-constexpr Pen outlinePen{{170, 170, 100}};  // the result dialog's button
+constexpr Pen outlinePen{{170, 170, 100}};  // the dialogs' OK button
 }  // namespace palette
 
 }  // namespace quabble

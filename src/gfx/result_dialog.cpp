@@ -3,6 +3,7 @@
 #include "base/round_half_even.hpp"
 #include "engine/level_table.hpp"
 #include "gfx/message_template.hpp"
+#include "gfx/ok_button.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/string_table.hpp"
 
@@ -11,7 +12,6 @@ namespace {
 
 constexpr Size designedSize{457, 265};
 constexpr Font textFont{Typeface::Sans, 12};
-constexpr Font buttonFont{Typeface::Sans, 14};
 
 std::string figures(std::uint16_t templateId, const GameStats& stats, std::int32_t level) {
     return fillTemplate(
@@ -48,7 +48,7 @@ void ResultDialog::Form_Load() {
     fillBox(frameBox_);
     canvas().font = textFont;
     drawShadowText(statsBox_, 2, resultText(game_, goNextLevel), text_format::centre);
-    drawOkButton();
+    drawOkButton(okBox_);
 }
 
 void ResultDialog::layOut() {
@@ -61,20 +61,7 @@ void ResultDialog::layOut() {
                  .width = width - 2 * u,
                  .height = height - 4 * u,
                  .textColour = palette::panelTextColour};
-    okBox_ = {.surface = &canvas(),
-              .left = roundHalfEven((width - 2 * u) / 2.0),
-              .top = height - 2 * u,
-              .width = 2 * u,
-              .height = 30,
-              .fillBrush = palette::backgroundBrush,
-              .framePen = palette::outlinePen,
-              .textColour = palette::panelTextColour};
-}
-
-void ResultDialog::drawOkButton() {
-    canvas().font = buttonFont;
-    const BoxStyle style = okBox_.hovered ? BoxStyle::DoubleFramed : BoxStyle::Framed;
-    drawLabelledBox(okBox_, style, okBox_.hovered, okBox_.hovered ? 8 : 6, loadString(string_ids::ok));
+    okBox_ = layOutOkButton(canvas(), roundHalfEven((width - okButtonSize.width) / 2.0), height - 2 * u);
 }
 
 Task<> ResultDialog::Form_MouseDown(float x, float y) {
@@ -88,7 +75,7 @@ Task<> ResultDialog::Form_MouseMove(float x, float y) {
     if (over == okBox_.hovered)
         co_return;
     okBox_.hovered = over;
-    drawOkButton();
+    drawOkButton(okBox_);
     refresh();
 }
 

@@ -28,7 +28,6 @@ class ResultDialog final : public Window {
     Task<> Form_KeyPress(std::int16_t key) override;
 
     void layOut();
-    void drawOkButton();
 
     const GameState& game_;
     std::int16_t layoutUnit_;

@@ -6,7 +6,6 @@ namespace {
 constexpr std::int32_t centredLine =
     text_format::centre + text_format::verticalCentre + text_format::singleLine;
 
-constexpr Colour buttonFace{226, 230, 240};
 constexpr Colour edge{28, 38, 78};
 constexpr Colour focusRing{249, 249, 230};
 
@@ -19,12 +18,15 @@ Task<> Control::keyPress(std::int16_t) {
     co_return;
 }
 
-void paintControlEdge(Surface& surface, const Rect& area, bool hasFocus) {
-    surface.outline(area, edge);
-    if (!hasFocus)
-        return;
+void paintFocusRing(Surface& surface, const Rect& area) {
     surface.outline(area.shrunkBy(-1), focusRing);
     surface.outline(area.shrunkBy(-2), focusRing);
+}
+
+void paintControlEdge(Surface& surface, const Rect& area, bool hasFocus) {
+    surface.outline(area, edge);
+    if (hasFocus)
+        paintFocusRing(surface, area);
 }
 
 void Label::paint(Surface& surface, bool) const {
@@ -33,9 +35,8 @@ void Label::paint(Surface& surface, bool) const {
 }
 
 void PushButton::paint(Surface& surface, bool hasFocus) const {
-    surface.fill(area, buttonFace);
-    paintControlEdge(surface, area, hasFocus);
-    drawText(surface, area, caption, centredLine, controlInk, font);
+    if (hasFocus)
+        paintFocusRing(surface, area);
 }
 
 Task<> PushButton::mouseDown(Point, bool) {

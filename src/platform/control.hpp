@@ -38,7 +38,9 @@ class Control {
     virtual void edit(EditCommand /*command*/, bool /*extends*/) {}
 };
 
-// Paints the edge of a control that takes the keyboard and, while it has the focus, a bright ring around it.
+// Paints the bright ring around the control that has the focus.
+void paintFocusRing(Surface& surface, const Rect& area);
+// Paints the edge of a control that takes the keyboard and, while it has the focus, the ring.
 void paintControlEdge(Surface& surface, const Rect& area, bool hasFocus);
 constexpr Colour controlInk{16, 22, 48};
 
@@ -55,12 +57,11 @@ class Label final : public Control {
     Task<> mouseDown(Point, bool) override { return onClick(); }
 };
 
-// A button of the platform's own make. It acts when the mouse button is let go over it, so that moving off it
-// takes a press back. The space key presses it while it has the focus.
+// A button on the window's picture, which shows what it looks like: the control adds the ring of the focus.
+// It acts when the mouse button is let go over it, so that moving off it takes a press back. The space key
+// presses it while it has the focus.
 class PushButton final : public Control {
  public:
-    std::string caption;  // Windows-1252
-    Font font;
     std::function<Task<>()> onClick;
 
     void paint(Surface& surface, bool hasFocus) const override;

@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "gfx/ok_button.hpp"
 #include "gfx/painters.hpp"
 
 namespace quabble {
@@ -26,9 +27,6 @@ NameEntry::NameEntry(MessageLoop& loop, Window& owner) : Window(loop, &owner), t
     txtName_.font = font;
     txtName_.area = Rect::ofSize(margin, 108, dialogSize.width - 2 * margin, 28);
     txtName_.visible = true;
-    OKButton_.caption = "OK";
-    OKButton_.font = font;
-    OKButton_.area = Rect::ofSize((dialogSize.width - 90) / 2, 156, 90, 30);
     OKButton_.visible = true;
     OKButton_.onClick = [this] { return OKButton_Click(); };
     addControl(txtName_);
@@ -51,6 +49,9 @@ void NameEntry::Form_Load() {
     drawShadowText(label(22, 44, palette::valueColour), 1, congratulation, text_format::centre);
     canvas().font = font;
     drawShadowText(label(84, 22, palette::highlightColour), 1, "Enter Your Name", defaultTextFormat);
+    const ScreenButton okButton = layOutOkButton(canvas(), (dialogSize.width - okButtonSize.width) / 2, 156);
+    drawOkButton(okButton);
+    OKButton_.area = okButton.rect();
     txtName_.clear();
     setFocus(&txtName_);
 }

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "gfx/screen_button.hpp"
+
+namespace quabble {
+
+// The OK button that the dialogs have in common. It is drawn on the dialog's canvas; a dialog that takes the
+// keyboard lays a PushButton over it.
+constexpr Size okButtonSize{90, 30};
+ScreenButton layOutOkButton(Canvas& canvas, std::int32_t left, std::int32_t top);
+
+// Draws it, highlighted when it is hovered.
+void drawOkButton(const ScreenButton& button);
+
+}  // namespace quabble
