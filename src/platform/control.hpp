@@ -57,7 +57,7 @@ class Label final : public Control {
     Task<> mouseDown(Point, bool) override { return onClick(); }
 };
 
-// A button on the window's picture, which shows what it looks like: the control adds the ring of the focus.
+// A button whose look is drawn on the window's picture; the control adds the ring of the focus.
 // It acts when the mouse button is let go over it, so that moving off it takes a press back. The space key
 // presses it while it has the focus.
 class PushButton final : public Control {
