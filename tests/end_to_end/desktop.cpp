@@ -48,11 +48,14 @@ Desktop::~Desktop() {
     ::Window found = None;
     waitUntil("the window " + caption, [&] {
         found = find(root_, caption);
-        XWindowAttributes attributes{};
-        return found != None && XGetWindowAttributes(display_, found, &attributes) != 0 &&
-               attributes.map_state == IsViewable;
+        return found != None && isVisible(found);
     });
     return found;
+}
+
+bool Desktop::isVisible(::Window window) {
+    XWindowAttributes attributes{};
+    return XGetWindowAttributes(display_, window, &attributes) != 0 && attributes.map_state == IsViewable;
 }
 
 ::Window Desktop::find(::Window below, const std::string& caption) {
@@ -117,13 +120,43 @@ void Desktop::waitForFocus(WindowOnScreen window) {
     });
 }
 
+void Desktop::minimise(::Window window) {
+    XIconifyWindow(display_, window, DefaultScreen(display_));
+    waitUntil("the window's leaving", [&] { return !isVisible(window); });
+}
+
+void Desktop::restore(::Window window) {
+    constexpr long fromTaskBar = 2;
+    askWindowManager(window, "_NET_ACTIVE_WINDOW", fromTaskBar);
+    waitUntil("the window's return", [&] { return isVisible(window); });
+}
+
+void Desktop::showWorkspace(int number) {
+    askWindowManager(root_, "_NET_CURRENT_DESKTOP", number);
+}
+
+// A message of the Extended Window Manager Hints.
+void Desktop::askWindowManager(::Window window, const char* what, long first) {
+    XEvent message{};
+    message.xclient.type = ClientMessage;
+    message.xclient.window = window;
+    message.xclient.message_type = XInternAtom(display_, what, False);
+    message.xclient.format = 32;
+    message.xclient.data.l[0] = first;
+    XSendEvent(display_, root_, False, SubstructureNotifyMask | SubstructureRedirectMask, &message);
+    XSync(display_, False);
+}
+
 Surface Desktop::look(::Window window) {
     XWindowAttributes attributes{};
     XGetWindowAttributes(display_, window, &attributes);
     Surface seen(attributes.width, attributes.height);
-    XImage* image = XGetImage(display_, window, 0, 0, static_cast<unsigned>(attributes.width),
-                              static_cast<unsigned>(attributes.height), AllPlanes, ZPixmap);
-    require(image != nullptr, "a picture of the window");
+    XImage* image = nullptr;
+    waitUntil("a window that lies on the screen", [&] {  // a restored one may come flying
+        image = XGetImage(display_, window, 0, 0, static_cast<unsigned>(attributes.width),
+                          static_cast<unsigned>(attributes.height), AllPlanes, ZPixmap);
+        return image != nullptr;
+    });
     for (int y = 0; y < attributes.height; ++y) {
         for (int x = 0; x < attributes.width; ++x)
             seen.row(y)[static_cast<std::size_t>(x)] =

@@ -24,9 +24,16 @@ class Desktop {
     WindowOnScreen waitForWindow(const std::string& caption);
     bool hasWindow(const std::string& caption) { return find(root_, caption) != 0; }
 
+    bool isVisible(WindowOnScreen window);
+
     void click(WindowOnScreen window, int x, int y);
     void clickCloseButton(WindowOnScreen window);
     void press(unsigned long keysym);
+
+    void minimise(WindowOnScreen window);
+    // As a task bar does; comes back when the window is seen.
+    void restore(WindowOnScreen window);
+    void showWorkspace(int number);  // counted from 0
 
     void type(const std::string& lowerCaseLetters);
     void waitForFocus(WindowOnScreen window);
@@ -36,6 +43,7 @@ class Desktop {
 
  private:
     WindowOnScreen find(WindowOnScreen below, const std::string& caption);
+    void askWindowManager(WindowOnScreen window, const char* what, long first);
 
     _XDisplay* display_;
     WindowOnScreen root_;

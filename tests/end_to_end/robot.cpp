@@ -2,14 +2,10 @@
 // real pointer, keeps its own count of the score and compares the panel and the result dialog with it.
 
 #include <X11/keysym.h>
-#include <sys/wait.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <chrono>
 #include <cstdio>
-#include <cstdlib>
-#include <filesystem>
 #include <string>
 #include <thread>
 #include <utility>
@@ -17,51 +13,27 @@
 #include "desktop.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/result_dialog.hpp"
-#include "gfx/sprite_sheet.hpp"
 #include "player.hpp"
+#include "running_game.hpp"
 
 namespace quabble {
 namespace {
 
 using namespace std::chrono_literals;
 
-constexpr int cellSize = 28;
-constexpr int boardLeft = 232;
-constexpr const char* mainCaption = "Quabble  Ver 1.0";
 constexpr const char* playerName = "robot";
-
-Surface partOf(const Surface& picture, const Rect& area) {
-    Surface part(area.width(), area.height());
-    part.copy(part.bounds(), picture, {area.left, area.top});
-    return part;
-}
 
 class Robot {
  public:
-    explicit Robot(std::string program) : program_(std::move(program)) {
-        const std::string folder = std::filesystem::path(program_).parent_path().string() + "/";
-        const Surface sheet = loadGraphics(folder).spriteSheet;
-        for (int tile = 0; tile < tiles::count; ++tile)
-            tiles_.push_back(partOf(sheet, Rect::ofSize(cellSize * tile, 0, cellSize, cellSize)));
-    }
+    explicit Robot(std::string program) : game_(desktop_, std::move(program)) {}
 
-    void startProgram() {
-        child_ = fork();
-        if (child_ == 0) {
-            execl(program_.c_str(), program_.c_str(), nullptr);
-            _exit(127);
-        }
-        main_ = desktop_.waitForWindow(mainCaption);
-        desktop_.waitForFocus(main_);
-        std::this_thread::sleep_for(500ms);
-    }
+    void startProgram() { game_.start(); }
 
     // Plays one game and leaves it at `moves` moves, or when it has ended by itself.
     void play(GameMode mode, int moves) {
         score_ = blocks_ = largest_ = 0;
-        desktop_.click(main_, 337, 15 + static_cast<int>(mode) * 52 + 2);
+        game_.begin(mode);
         const bool training = mode == GameMode::Training;
-        boardTop_ = training ? 37 : 31;
         int made = 0;
         for (; made < moves; ++made) {
             if (mode == GameMode::Timed)
@@ -69,8 +41,8 @@ class Robot {
             const auto [place, size] = choose(model::read(settledBoard()));
             if (hasEnded() || size < (training ? 2 : 3))
                 break;
-            const Rect cell = cellAt(place.first - 1, place.second - 1);
-            desktop_.click(main_, cell.left + 14, cell.top + 14);
+            const Rect cell = game_.cellAt(place.first - 1, place.second - 1);
+            desktop_.click(game_.window(), cell.left + 14, cell.top + 14);
             score_ += size * (size + 1) / 2;
             blocks_ += size;
             largest_ = std::max(largest_, size);
@@ -78,7 +50,7 @@ class Robot {
                       [this] { return showsScore(); });
         }
         if (!hasEnded())
-            desktop_.click(main_, 95, training ? 385 : 465);
+            game_.clickEndGame();
         checkResult(mode);
         enterName();
         checkBestEntry();
@@ -87,15 +59,13 @@ class Robot {
 
     // The score of the last game stands at the top of its mode's table, opened from the main menu.
     void checkTable(GameMode mode) {
-        desktop_.click(main_, 337, 15 + (static_cast<int>(mode) + 3) * 52 + 2);
+        game_.choose(static_cast<int>(mode) + 3);
         checkBestEntry();
     }
 
     void closeAndCheckExit() {
-        desktop_.clickCloseButton(main_);
-        int status = -1;
-        waitUntil("the program's end", [&] { return waitpid(child_, &status, WNOHANG) == child_; });
-        require(WIFEXITED(status) && WEXITSTATUS(status) == 0, "exit status 0");
+        desktop_.clickCloseButton(game_.window());
+        game_.waitForExit();
     }
 
  private:
@@ -107,7 +77,7 @@ class Robot {
         std::string last;
         auto since = std::chrono::steady_clock::now();
         waitUntil("a board at rest", [&] {
-            const std::string seen = readBoard();
+            const std::string seen = game_.readBoard();
             if (seen != std::exchange(last, seen) || seen.find_first_of("?sWXYZ") != std::string::npos)
                 since = std::chrono::steady_clock::now();
             return hasEnded() || std::chrono::steady_clock::now() - since > 600ms;
@@ -118,22 +88,7 @@ class Robot {
     // Until the timer has pushed a row: then there is time for a move before the next one.
     void waitForRow() {
         const std::string before = settledBoard();
-        waitUntil("a row from below", [&] { return readBoard() != before; });
-    }
-
-    Rect cellAt(int column, int row) const {
-        return Rect::ofSize(boardLeft + column * cellSize, boardTop_ + row * cellSize, cellSize, cellSize);
-    }
-
-    std::string readBoard() {
-        const Surface window = desktop_.look(main_);
-        std::string letters;
-        for (int i = 0; i < 192; ++i) {
-            const Surface seen = partOf(window, cellAt(i % 12, i / 12));
-            const auto tile = std::ranges::find(tiles_, seen) - tiles_.begin();
-            letters += tile < std::ssize(tiles_) ? tileLetters[static_cast<std::size_t>(tile)] : '?';
-        }
-        return letters;
+        waitUntil("a row from below", [&] { return game_.readBoard() != before; });
     }
 
     bool showsScore() {
@@ -144,7 +99,7 @@ class Robot {
                          .fillBrush = palette::backgroundBrush,
                          .textColour = palette::valueColour},
                         BoxStyle::Plain, false, 2, std::to_string(score_));
-        return partOf(desktop_.look(main_), Rect::ofSize(25, 240, 140, 30)) == expected.picture;
+        return partOf(game_.look(), Rect::ofSize(25, 240, 140, 30)) == expected.picture;
     }
 
     void checkResult(GameMode mode) {
@@ -197,11 +152,7 @@ class Robot {
     }
 
     Desktop desktop_;
-    std::string program_;
-    std::vector<Surface> tiles_;
-    pid_t child_ = 0;
-    WindowOnScreen main_ = 0;
-    int boardTop_ = 0;
+    RunningGame game_;
     int score_ = 0;
     int blocks_ = 0;
     int largest_ = 0;

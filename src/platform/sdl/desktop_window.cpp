@@ -3,6 +3,7 @@
 #include <SDL2/SDL.h>
 
 #include <algorithm>
+#include <utility>
 #include <vector>
 
 #include "base/round_half_even.hpp"
@@ -88,11 +89,11 @@ void DesktopWindow::show(const Surface& picture) {
     picture_ = &picture;
     if (!window_)
         return;
-    const bool isFirst = (SDL_GetWindowFlags(sdl()) & SDL_WINDOW_HIDDEN) != 0;
-    if (isFirst && !shared_)
-        SDL_GetWindowSurface(sdl());  // for which SDL makes a Wayland window anew; that is not to be seen
-    if (isFirst)
+    if (!std::exchange(isOpened_, true)) {
+        if (!shared_)
+            SDL_GetWindowSurface(sdl());  // for which SDL makes a Wayland window anew; that is not to be seen
         SDL_ShowWindow(sdl());
+    }
     if (shared_)
         shared_->set(picture);
     else if (SDL_Surface* screen = SDL_GetWindowSurface(sdl()))

@@ -48,6 +48,7 @@ class DesktopWindow {
     const Surface* picture_ = nullptr;
     std::unique_ptr<SharedPicture> shared_;  // or else it is shown by SDL's window surface
     Magnifier magnifier_;
+    bool isOpened_ = false;  // from then on it is the desktop's to hide it and to bring it back
 };
 
 }  // namespace quabble

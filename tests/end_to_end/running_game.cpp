@@ -1,0 +1,80 @@
+#include "running_game.hpp"
+
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <thread>
+#include <utility>
+
+#include "../engine/board_notation.hpp"
+#include "gfx/painters.hpp"
+#include "gfx/sprite_sheet.hpp"
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr int cellSize = 28;
+constexpr int boardLeft = 232;
+
+}  // namespace
+
+RunningGame::RunningGame(Desktop& desktop, std::string program)
+    : desktop_(desktop), program_(std::move(program)) {
+    const std::string folder = std::filesystem::path(program_).parent_path().string() + "/";
+    const Surface sheet = loadGraphics(folder).spriteSheet;
+    for (int tile = 0; tile < tiles::count; ++tile)
+        tiles_.push_back(partOf(sheet, Rect::ofSize(cellSize * tile, 0, cellSize, cellSize)));
+}
+
+void RunningGame::start() {
+    process_ = fork();
+    if (process_ == 0) {
+        execl(program_.c_str(), program_.c_str(), nullptr);
+        _exit(127);
+    }
+    window_ = desktop_.waitForWindow("Quabble  Ver 1.0");
+    desktop_.waitForFocus(window_);
+    std::this_thread::sleep_for(500ms);
+}
+
+void RunningGame::choose(int button) {
+    desktop_.click(window_, 337, 15 + button * 52 + 2);
+}
+
+void RunningGame::begin(GameMode mode) {
+    mode_ = mode;
+    choose(static_cast<int>(mode));
+    waitUntil("a board", [this] { return readBoard().find('?') == std::string::npos; });
+}
+
+void RunningGame::clickEndGame() {
+    desktop_.click(window_, 95, mode_ == GameMode::Training ? 385 : 465);
+}
+
+void RunningGame::waitForExit() {
+    int status = -1;
+    waitUntil("the program's end", [&] { return waitpid(process_, &status, WNOHANG) == process_; });
+    require(WIFEXITED(status) && WEXITSTATUS(status) == 0, "exit status 0");
+}
+
+Rect RunningGame::cellAt(int column, int row) const {
+    const int top = mode_ == GameMode::Training ? 37 : 31;
+    return Rect::ofSize(boardLeft + column * cellSize, top + row * cellSize, cellSize, cellSize);
+}
+
+std::string RunningGame::readBoard() {
+    const Surface window = look();
+    std::string letters;
+    for (int i = 0; i < 192; ++i) {
+        const Surface seen = partOf(window, cellAt(i % 12, i / 12));
+        const auto tile = std::ranges::find(tiles_, seen) - tiles_.begin();
+        letters += tile < std::ssize(tiles_) ? tileLetters[static_cast<std::size_t>(tile)] : '?';
+    }
+    return letters;
+}
+
+}  // namespace quabble

@@ -1,0 +1,49 @@
+#pragma once
+
+#include <sys/types.h>
+
+#include <string>
+#include <vector>
+
+#include "desktop.hpp"
+#include "engine/game_state.hpp"
+#include "platform/surface.hpp"
+
+namespace quabble {
+
+inline Surface partOf(const Surface& picture, const Rect& area) {
+    Surface part(area.width(), area.height());
+    part.copy(part.bounds(), picture, {area.left, area.top});
+    return part;
+}
+
+// The program while it runs: its process, its main window and what is to be seen there.
+class RunningGame {
+ public:
+    RunningGame(Desktop& desktop, std::string program);
+
+    // Comes back when the main menu is there and has the keyboard.
+    void start();
+    // Chooses a button of the main menu, counted from 1.
+    void choose(int button);
+    void begin(GameMode mode);  // comes back when the board is there
+    void clickEndGame();
+    void waitForExit();  // with status 0
+
+    WindowOnScreen window() const { return window_; }
+    pid_t process() const { return process_; }
+    Surface look() { return desktop_.look(window_); }
+    Rect cellAt(int column, int row) const;  // counted from 0
+    // The letters of the board as it is seen, '?' for cells that cannot be read.
+    std::string readBoard();
+
+ private:
+    Desktop& desktop_;
+    std::string program_;
+    std::vector<Surface> tiles_;
+    pid_t process_ = 0;
+    WindowOnScreen window_ = 0;
+    GameMode mode_ = GameMode::Training;
+};
+
+}  // namespace quabble

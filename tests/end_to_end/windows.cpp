@@ -1,0 +1,124 @@
+// Does to the windows what desktops and hasty people do to them: windows PROGRAM.
+
+#include <X11/keysym.h>
+
+#include <chrono>
+#include <string>
+#include <thread>
+
+#include "desktop.hpp"
+#include "gfx/palette.hpp"
+#include "player.hpp"
+#include "running_game.hpp"
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+class Story {
+ public:
+    explicit Story(std::string program) : game_(desktop_, std::move(program)) { game_.start(); }
+
+    void aMinimisedGameStaysAwayAndComesBackPaused(GameMode mode) {
+        game_.begin(mode);
+        for (int time = 0; time < 2; ++time) {
+            desktop_.minimise(game_.window());
+            checkItStaysAway();
+            desktop_.restore(game_.window());
+            resume();
+        }
+        checkTheKeyboardIsAlive();
+        leaveGame();
+    }
+
+    void aKeyInMidMoveHidesTheGame() {
+        game_.begin(GameMode::Strategy);
+        const std::string before = game_.readBoard();
+        const Choice best = choose(model::read(before));
+        require(best.size > 2, "a cluster to click");
+        const Rect cell = game_.cellAt(best.place.first - 1, best.place.second - 1);
+        desktop_.click(game_.window(), cell.left + 14, cell.top + 14);
+        waitUntil("the move's beginning", [&] { return game_.readBoard() != before; });
+        desktop_.press(XK_p);
+        waitUntil("the window's leaving", [&] { return !desktop_.isVisible(game_.window()); });
+        checkItStaysAway();
+        desktop_.restore(game_.window());
+        resume();
+        leaveGame();
+        closeDialog("Best Score");
+        closeDialog("Best Scores - Quabble");
+    }
+
+    void theKeyboardComesBackFromAnotherWorkspace() {
+        game_.begin(GameMode::Strategy);
+        desktop_.showWorkspace(1);
+        std::this_thread::sleep_for(1s);
+        desktop_.showWorkspace(0);
+        waitUntil("the window's return", [&] { return desktop_.isVisible(game_.window()); });
+        resume();
+        checkTheKeyboardIsAlive();
+        leaveGame();
+    }
+
+    void close() {
+        desktop_.clickCloseButton(game_.window());
+        game_.waitForExit();
+    }
+
+ private:
+    bool isPaused() { return game_.look().at(2, 2) == palette::pauseBackground; }
+
+    void checkItStaysAway() {
+        const auto end = std::chrono::steady_clock::now() + 1500ms;
+        while (std::chrono::steady_clock::now() < end) {
+            require(!desktop_.isVisible(game_.window()), "a minimised window stays away");
+            std::this_thread::sleep_for(10ms);
+        }
+    }
+
+    void resume() {
+        waitUntil("the pause notice", [&] { return isPaused(); });
+        desktop_.click(game_.window(), 400, 535);
+        waitUntil("the game's going on", [&] { return !isPaused(); });
+    }
+
+    // A key hides the game and pauses it.
+    void checkTheKeyboardIsAlive() {
+        desktop_.waitForFocus(game_.window());
+        desktop_.press(XK_p);
+        waitUntil("the window's leaving", [&] { return !desktop_.isVisible(game_.window()); });
+        desktop_.restore(game_.window());
+        resume();
+    }
+
+    void leaveGame() {
+        game_.clickEndGame();
+        closeDialog("Game Statistics");
+    }
+
+    void closeDialog(const std::string& caption) {
+        desktop_.waitForFocus(desktop_.waitForWindow(caption));
+        std::this_thread::sleep_for(1s);
+        desktop_.press(XK_Return);
+        waitUntil("the end of " + caption, [&] { return !desktop_.hasWindow(caption); });
+    }
+
+    Desktop desktop_;
+    RunningGame game_;
+};
+
+}  // namespace
+}  // namespace quabble
+
+int main(int argc, char** argv) {
+    using quabble::GameMode;
+    quabble::require(argc == 2, "usage: windows PROGRAM");
+    quabble::Story story(argv[1]);
+    story.aMinimisedGameStaysAwayAndComesBackPaused(GameMode::Strategy);
+    story.aMinimisedGameStaysAwayAndComesBackPaused(GameMode::Timed);
+    story.aKeyInMidMoveHidesTheGame();
+    story.theKeyboardComesBackFromAnotherWorkspace();
+    story.close();
+    return 0;
+}
