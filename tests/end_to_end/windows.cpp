@@ -61,6 +61,19 @@ class Story {
         leaveGame();
     }
 
+    void aDialogKeepsTheKeyboard() {
+        const std::string caption = "Best Scores - Quabble";
+        game_.choose(4);
+        desktop_.waitForFocus(desktop_.waitForWindow(caption));
+        desktop_.click(game_.window(), 20, 280);  // which lies behind it
+        closeDialog(caption);
+        game_.choose(4);
+        desktop_.waitForFocus(desktop_.waitForWindow(caption));
+        desktop_.minimise(game_.window());
+        desktop_.restore(game_.window());
+        closeDialog(caption);
+    }
+
     void close() {
         desktop_.clickCloseButton(game_.window());
         game_.waitForExit();
@@ -119,6 +132,7 @@ int main(int argc, char** argv) {
     story.aMinimisedGameStaysAwayAndComesBackPaused(GameMode::Timed);
     story.aKeyInMidMoveHidesTheGame();
     story.theKeyboardComesBackFromAnotherWorkspace();
+    story.aDialogKeepsTheKeyboard();
     story.close();
     return 0;
 }

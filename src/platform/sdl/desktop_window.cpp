@@ -44,8 +44,10 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
         SDL_SetWindowModalFor(sdl(), owner->sdl());
     if (const auto x11 = X11Window::of(sdl())) {
         x11->setIcons(icons);
-        if (isDialog)
+        if (isDialog) {
             x11->haveOnlyCloseButton();
+            x11->beModal();
+        }
         if (size == clientSize_)
             shared_ = SharedPicture::of(*x11, size);
     }
@@ -135,6 +137,12 @@ void DesktopWindow::fill(SDL_Surface& screen, const Surface& picture) {
                                                              32, stride, SDL_PIXELFORMAT_RGB888);
     SDL_BlitSurface(source, nullptr, &screen, nullptr);
     SDL_FreeSurface(source);
+}
+
+// On Wayland one can only ask for it.
+void DesktopWindow::takeKeyboard() {
+    if (SDL_SetWindowInputFocus(sdl()) != 0)
+        SDL_RaiseWindow(sdl());
 }
 
 Point DesktopWindow::programPixel(Point place) const {

@@ -28,6 +28,8 @@ class DesktopWindow {
     // A window that was uncovered, restored or resized gets its picture again.
     void showAgain();
 
+    void takeKeyboard();
+
     // From the desktop's coordinates within the window to the program's pixels, and back.
     Point programPixel(Point place) const;
     Rect placeOf(const Rect& programPixels) const;

@@ -12,6 +12,7 @@
 #include "platform/sdl/detached_process.hpp"
 #include "platform/sdl/sdl_events.hpp"
 #include "platform/sdl/x11_window.hpp"
+#include "platform/window.hpp"
 
 namespace quabble {
 namespace {
@@ -107,6 +108,9 @@ void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
         if (shown != nullptr)
             shown->showAgain();
     }
+    if (event.type == SDL_WINDOWEVENT &&
+        (event.window.event == SDL_WINDOWEVENT_FOCUS_GAINED || event.window.event == SDL_WINDOWEVENT_SHOWN))
+        handOnKeyboard(loop);
     auto input = translate(event);
     if (!isMeantForItsWindow(event) || !input)
         return;
@@ -118,6 +122,15 @@ void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
         input->y = static_cast<float>(place.y);
     }
     loop.post(*input);
+}
+
+// While a dialog is open the keyboard is the innermost one's, whichever of the program's windows the desktop
+// has given it to.
+void SdlFrontEnd::handOnKeyboard(const MessageLoop& loop) {
+    DesktopWindow* dialog = loop.modalWindow() == nullptr ? nullptr : find(loop.modalWindow()->id());
+    const SDL_Window* focused = SDL_GetKeyboardFocus();
+    if (dialog != nullptr && focused != nullptr && focused != dialog->sdl())
+        dialog->takeKeyboard();
 }
 
 // False for what a key does that has been held down since another window had the focus.

@@ -48,6 +48,7 @@ class SdlFrontEnd final : public FrontEnd {
     void waitForEvents(MessageLoop& loop);
     std::optional<Clock::duration> timeLeft(const MessageLoop& loop);
     void take(const SDL_Event& event, MessageLoop& loop);
+    void handOnKeyboard(const MessageLoop& loop);
     bool isMeantForItsWindow(const SDL_Event& event);
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;

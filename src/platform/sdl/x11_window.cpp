@@ -95,6 +95,12 @@ void X11Window::haveOnlyCloseButton() const {
                     reinterpret_cast<const unsigned char*>(hints), std::size(hints));
 }
 
+void X11Window::beModal() const {
+    const Atom modal = XInternAtom(display_, "_NET_WM_STATE_MODAL", False);
+    XChangeProperty(display_, window_, XInternAtom(display_, "_NET_WM_STATE", False), XA_ATOM, 32,
+                    PropModeAppend, reinterpret_cast<const unsigned char*>(&modal), 1);
+}
+
 // Each is its width and height and then its pixels, opacity first: the format of the Extended Window Manager
 // Hints.
 void X11Window::setIcons(std::span<const Icon> icons) const {

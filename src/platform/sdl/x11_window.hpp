@@ -32,6 +32,8 @@ class X11Window {
     std::optional<double> dotsPerInch() const;
     // Takes the buttons to minimise and maximise off a dialog's frame: its owner could not bring it back.
     void haveOnlyCloseButton() const;
+    // Tells the window manager of a dialog that is not shown yet: its owner takes no keyboard meanwhile.
+    void beModal() const;
     void setIcons(std::span<const Icon> icons) const;
 
  private:
