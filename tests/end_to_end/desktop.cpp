@@ -99,9 +99,11 @@ void Desktop::clickCloseButton(::Window window) {
     click(window, attributes.width - 10, -10);
 }
 
-void Desktop::press(KeySym keysym) {
+void Desktop::press(KeySym keysym, std::chrono::milliseconds howLong) {
     const KeyCode code = XKeysymToKeycode(display_, keysym);
     XTestFakeKeyEvent(display_, code, True, CurrentTime);
+    XSync(display_, False);
+    std::this_thread::sleep_for(howLong);
     XTestFakeKeyEvent(display_, code, False, CurrentTime);
     XSync(display_, False);
 }

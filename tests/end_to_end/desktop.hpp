@@ -28,7 +28,7 @@ class Desktop {
 
     void click(WindowOnScreen window, int x, int y);
     void clickCloseButton(WindowOnScreen window);
-    void press(unsigned long keysym);
+    void press(unsigned long keysym, std::chrono::milliseconds howLong = {});
 
     void minimise(WindowOnScreen window);
     // As a task bar does; comes back when the window is seen.

@@ -146,7 +146,6 @@ class Robot {
         waitUntil("the best score and its name",
                   [&] { return partOf(desktop_.look(view), seen) == partOf(expected.picture, seen); });
         desktop_.waitForFocus(view);
-        std::this_thread::sleep_for(1s);  // a person reads it; sooner, Enter would count as still held
         desktop_.press(XK_Return);
         waitUntil("the view's end", [this] { return !desktop_.hasWindow("Best Scores - Quabble"); });
     }

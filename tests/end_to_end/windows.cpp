@@ -34,12 +34,7 @@ class Story {
 
     void aKeyInMidMoveHidesTheGame() {
         game_.begin(GameMode::Strategy);
-        const std::string before = game_.readBoard();
-        const Choice best = choose(model::read(before));
-        require(best.size > 2, "a cluster to click");
-        const Rect cell = game_.cellAt(best.place.first - 1, best.place.second - 1);
-        desktop_.click(game_.window(), cell.left + 14, cell.top + 14);
-        waitUntil("the move's beginning", [&] { return game_.readBoard() != before; });
+        beginMove();
         desktop_.press(XK_p);
         waitUntil("the window's leaving", [&] { return !desktop_.isVisible(game_.window()); });
         checkItStaysAway();
@@ -74,12 +69,35 @@ class Story {
         closeDialog(caption);
     }
 
+    void enterClosesOneDialogAPress() {
+        for (const auto held : {0ms, 80ms, 1500ms}) {
+            game_.begin(GameMode::Strategy);
+            beginMove();
+            game_.clickEndGame();
+            closeDialog("Game Statistics");
+            desktop_.waitForFocus(desktop_.waitForWindow("Best Score"));
+            desktop_.press(XK_Return, held);
+            const WindowOnScreen table = desktop_.waitForWindow("Best Scores - Quabble");
+            require(desktop_.isVisible(table), "the table outlives the key that brought it");
+            closeDialog("Best Scores - Quabble");
+        }
+    }
+
     void close() {
         desktop_.clickCloseButton(game_.window());
         game_.waitForExit();
     }
 
  private:
+    void beginMove() {
+        const std::string before = game_.readBoard();
+        const Choice best = choose(model::read(before));
+        require(best.size > 2, "a cluster to click");
+        const Rect cell = game_.cellAt(best.place.first - 1, best.place.second - 1);
+        desktop_.click(game_.window(), cell.left + 14, cell.top + 14);
+        waitUntil("the move's beginning", [&] { return game_.readBoard() != before; });
+    }
+
     bool isPaused() { return game_.look().at(2, 2) == palette::pauseBackground; }
 
     void checkItStaysAway() {
@@ -112,7 +130,6 @@ class Story {
 
     void closeDialog(const std::string& caption) {
         desktop_.waitForFocus(desktop_.waitForWindow(caption));
-        std::this_thread::sleep_for(1s);
         desktop_.press(XK_Return);
         waitUntil("the end of " + caption, [&] { return !desktop_.hasWindow(caption); });
     }
@@ -133,6 +150,7 @@ int main(int argc, char** argv) {
     story.aKeyInMidMoveHidesTheGame();
     story.theKeyboardComesBackFromAnotherWorkspace();
     story.aDialogKeepsTheKeyboard();
+    story.enterClosesOneDialogAPress();
     story.close();
     return 0;
 }

@@ -30,19 +30,25 @@ TEST(DetachedProcess, GetsOneArgumentInItsFolderAndLeavesNothingBehind) {
     EXPECT_TRUE(waitpid(-1, nullptr, WNOHANG) == -1 && errno == ECHILD) << "a child is left to wait for";
 }
 
-TEST(HeldKeys, AKeyHeldSinceAnotherWindowHadTheFocusIsNotHeard) {
+TEST(HeldKeys, AKeyHeldSinceAnotherWindowHadTheKeyboardIsNotHeard) {
+    constexpr unsigned enter = 36, letter = 38;
     HeldKeys keys;
-    EXPECT_TRUE(keys.isMeantFor(1, 40, 5000));
-    EXPECT_TRUE(keys.isMeantFor(1, 40, 5600)) << "it repeats in its own window";
-    keys.release(40);  // the first window has lost the focus
-    EXPECT_FALSE(keys.isMeantFor(2, 40, 6200));
-    for (std::uint32_t time = 6240; time < 9000; time += 40)
-        EXPECT_FALSE(keys.isMeantFor(2, 40, time));
-    keys.release(40);
-    EXPECT_TRUE(keys.isMeantFor(2, 40, 9100)) << "it was let go and pressed again";
-    EXPECT_TRUE(keys.isMeantFor(3, 40, 10200)) << "too long ago to be held";
-    EXPECT_TRUE(keys.isMeantFor(4, 41, 10300)) << "another key";
-    EXPECT_TRUE(keys.isMeantFor(4, 40, 10400)) << "the other key has ended the repetition";
+    const auto hears = [&keys](unsigned key) {
+        keys.press(key);
+        return keys.isMeant();
+    };
+    EXPECT_TRUE(hears(enter)) << "where nobody tells what is held";
+
+    keys.changeWindow();
+    keys.areDown(HeldKeys::Keys().set(enter));
+    EXPECT_FALSE(hears(enter));
+    EXPECT_TRUE(hears(letter)) << "another key";
+    EXPECT_FALSE(hears(enter)) << "it is still held";
+    keys.release(enter);
+    EXPECT_TRUE(hears(enter)) << "it was let go and pressed again";
+
+    keys.areDown(HeldKeys::Keys().set(enter));  // as is told when the pointer enters the window, too
+    EXPECT_TRUE(hears(enter)) << "it repeats in its own window";
 }
 
 }  // namespace

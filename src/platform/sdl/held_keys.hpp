@@ -1,23 +1,30 @@
 #pragma once
 
-#include <cstdint>
+#include <bitset>
 
 namespace quabble {
 
 // Tells a key press that is meant for a window from the repetition of one that was meant for another: a key
-// that is still down when a dialog opens or closes goes on repeating in the window that has the focus then.
-// Only the key that was pressed last repeats.
+// that is still down when a dialog opens or closes goes on repeating in the window that has the keyboard
+// then. Keys have the desktop's numbers. Where nobody tells what is held, every press is meant.
 class HeldKeys {
  public:
-    // A press or a repetition, at a time in milliseconds. False when the window should not hear of it.
-    bool isMeantFor(std::uint32_t window, std::int32_t key, std::uint32_t time);
-    void release(std::int32_t key);
+    using Keys = std::bitset<256>;
+
+    // The keyboard goes to another window. Which keys are down then may be told right after it.
+    void changeWindow();
+    void areDown(const Keys& keys);
+
+    void press(unsigned key);
+    void release(unsigned key);
+
+    // Whether the window that has the keyboard should hear what is typed.
+    bool isMeant() const { return isMeant_; }
 
  private:
-    std::int32_t key_ = 0;
-    std::uint32_t window_ = 0;  // none when 0
-    std::uint32_t lastHeard_ = 0;
-    bool ignored_ = false;
+    Keys held_;  // since before the window had the keyboard
+    bool isAsked_ = false;
+    bool isMeant_ = true;
 };
 
 }  // namespace quabble

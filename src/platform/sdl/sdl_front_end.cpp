@@ -50,6 +50,7 @@ std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
     if (std::strcmp(SDL_GetCurrentVideoDriver(), "x11") == 0)
         SDL_SetHint(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0");
     X11Window::outliveErrors();
+    listenToX11();
     SDL_EnableScreenSaver();
     SDL_StopTextInput();
     if (std::signal(SIGHUP, passOnHangUp) == SIG_IGN)
@@ -101,6 +102,10 @@ std::optional<Clock::duration> SdlFrontEnd::timeLeft(const MessageLoop& loop) {
 }
 
 void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
+    if (const auto reported = translateX11(event)) {
+        take(*reported);
+        return;
+    }
     const WindowId window = idOf(windowOf(event));
     DesktopWindow* shown = find(window);
     if (event.type == SDL_WINDOWEVENT && (event.window.event == SDL_WINDOWEVENT_EXPOSED ||
@@ -111,8 +116,9 @@ void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
     if (event.type == SDL_WINDOWEVENT &&
         (event.window.event == SDL_WINDOWEVENT_FOCUS_GAINED || event.window.event == SDL_WINDOWEVENT_SHOWN))
         handOnKeyboard(loop);
+    const bool isTyped = event.type == SDL_KEYDOWN || event.type == SDL_TEXTINPUT;
     auto input = translate(event);
-    if (!isMeantForItsWindow(event) || !input)
+    if (!input || (isTyped && !heldKeys_.isMeant()))
         return;
     input->window = window;
     if (shown != nullptr) {
@@ -133,21 +139,20 @@ void SdlFrontEnd::handOnKeyboard(const MessageLoop& loop) {
         dialog->takeKeyboard();
 }
 
-// False for what a key does that has been held down since another window had the focus.
-bool SdlFrontEnd::isMeantForItsWindow(const SDL_Event& event) {
-    switch (event.type) {
-        case SDL_KEYDOWN:
-            textIsMeant_ =
-                heldKeys_.isMeantFor(event.key.windowID, event.key.keysym.scancode, event.key.timestamp);
-            return textIsMeant_;
-        case SDL_KEYUP:
-            heldKeys_.release(event.key.keysym.scancode);
-            textIsMeant_ = true;
-            return true;
-        case SDL_TEXTINPUT:
-            return textIsMeant_;
-        default:
-            return true;
+void SdlFrontEnd::take(const X11Event& event) {
+    switch (event.kind) {
+        case X11Event::Kind::KeyboardGained:
+            heldKeys_.changeWindow();
+            break;
+        case X11Event::Kind::KeysDown:
+            heldKeys_.areDown(event.down);
+            break;
+        case X11Event::Kind::KeyPressed:
+            heldKeys_.press(event.key);
+            break;
+        case X11Event::Kind::KeyReleased:
+            heldKeys_.release(event.key);
+            break;
     }
 }
 

@@ -11,6 +11,7 @@
 #include "platform/sdl/desktop_wait.hpp"
 #include "platform/sdl/desktop_window.hpp"
 #include "platform/sdl/held_keys.hpp"
+#include "platform/sdl/x11_events.hpp"
 
 union SDL_Event;
 
@@ -49,14 +50,13 @@ class SdlFrontEnd final : public FrontEnd {
     std::optional<Clock::duration> timeLeft(const MessageLoop& loop);
     void take(const SDL_Event& event, MessageLoop& loop);
     void handOnKeyboard(const MessageLoop& loop);
-    bool isMeantForItsWindow(const SDL_Event& event);
+    void take(const X11Event& event);
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
     std::vector<Icon> icons_;
     std::vector<WindowId> unopened_;  // for want of a place on the desktop; they close at once
     DesktopWait desktopWait_;
     HeldKeys heldKeys_;
-    bool textIsMeant_ = true;  // what the key that was pressed last types
 };
 
 }  // namespace quabble
