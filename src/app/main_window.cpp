@@ -77,6 +77,13 @@ void MainWindow::Form_Resize() {
         enablePause(true);
 }
 
+int MainWindow::screen() const {
+    enum { Menu, Game, PausedGame };
+    if (app_.game.mainMenuActive)
+        return Menu;
+    return gamePaused_ ? PausedGame : Game;
+}
+
 Task<> MainWindow::Form_MouseDown(float x, float y) {
     if (gamePaused_) {
         enablePause(false);

@@ -37,6 +37,7 @@ class MainWindow final : public Window, private Stage {
     Task<> Form_MouseDown(float x, float y) override;
     Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;
+    int screen() const override;
     Task<> clickBoard(float x, float y);
     Task<> lblPause_Click();
     Task<> timerBlocks_Timer();

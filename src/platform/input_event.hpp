@@ -52,8 +52,9 @@ struct InputEvent {
     float y = 0;
     std::int16_t key = 0;  // of a key press: a key that yields a character, modifiers alone do not
     EditCommand command = EditCommand::Left;
-    bool extends = false;   // of an edit or a mouse press: Shift is held, the selection grows
-    std::string text = {};  // of a text input, UTF-8
+    bool extends = false;         // of an edit or a mouse press: Shift is held, the selection grows
+    std::string text = {};        // of a text input, UTF-8
+    bool continuesClick = false;  // of a mouse press: it follows another quickly, as in a double click
 };
 
 }  // namespace quabble

@@ -104,10 +104,20 @@ Task<> MessageLoop::deliver(InputEvent event) {
     Window* window = findWindow(event.window);
     if (window == nullptr || !window->isShown())
         co_return;
+    if (event.kind == EventKind::MouseDown && !isMeant(event, *window))
+        co_return;
     const bool isInput = event.kind != EventKind::Minimised && event.kind != EventKind::Restored;
     if (isInput && modalWindow() != nullptr && modalWindow() != window)
         co_return;
     co_await window->handle(event);
+}
+
+// What the first press of a double click has brought onto the screen is not what the second one is meant for.
+bool MessageLoop::isMeant(const InputEvent& press, const Window& window) {
+    const std::pair screen(press.window, window.screen());
+    if (!press.continuesClick)
+        clickedScreen_ = screen;
+    return clickedScreen_ == screen;
 }
 
 Window* MessageLoop::findWindow(WindowId id) const {

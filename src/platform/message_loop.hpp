@@ -3,6 +3,7 @@
 #include <coroutine>
 #include <deque>
 #include <optional>
+#include <utility>
 #include <vector>
 
 #include "base/reused_memory.hpp"
@@ -106,6 +107,7 @@ class MessageLoop {
     Timer* firstDueTimer() const;
     Task<> deliverOne();
     Task<> deliver(InputEvent event);
+    bool isMeant(const InputEvent& press, const Window& window);
     Wait nextMessage() { return Wait{*this, std::nullopt}; }
     Window* findWindow(WindowId id) const;
 
@@ -114,6 +116,7 @@ class MessageLoop {
     std::vector<Timer*> timers_;
     std::vector<Window*> windows_;
     std::vector<Window*> modalWindows_;
+    std::pair<WindowId, int> clickedScreen_{};  // of the first press of a double click
     std::coroutine_handle<> program_;
     std::optional<TimePoint> programWaitsUntil_;
     std::uint32_t lastWindowId_ = 0;

@@ -60,6 +60,8 @@ class Window {
     // The control that the keyboard goes to; null for the window itself.
     void setFocus(Control* control);
 
+    // Which of its screens is shown, as a number, by a window that has several.
+    virtual int screen() const { return 0; }
     virtual void Form_Load() {}
     // The user wants the window to close; this unloads it.
     virtual Task<> Form_QueryUnload();

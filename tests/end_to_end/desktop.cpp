@@ -80,16 +80,20 @@ bool Desktop::isVisible(::Window window) {
     return found;
 }
 
-void Desktop::click(::Window window, int x, int y) {
+void Desktop::click(::Window window, int x, int y, int times) {
     std::this_thread::sleep_for(reactionTime);
     int screenX = 0;
     int screenY = 0;
     ::Window child = None;
     XTranslateCoordinates(display_, window, root_, x, y, &screenX, &screenY, &child);
     XTestFakeMotionEvent(display_, -1, screenX, screenY, CurrentTime);
-    XTestFakeButtonEvent(display_, 1, True, CurrentTime);
-    XTestFakeButtonEvent(display_, 1, False, CurrentTime);
-    XSync(display_, False);
+    for (int i = 0; i < times; ++i) {
+        if (i > 0)
+            std::this_thread::sleep_for(reactionTime);
+        XTestFakeButtonEvent(display_, 1, True, CurrentTime);
+        XTestFakeButtonEvent(display_, 1, False, CurrentTime);
+        XSync(display_, False);
+    }
 }
 
 // The last button of the title bar that the window manager has put above the window.

@@ -26,7 +26,7 @@ class Desktop {
 
     bool isVisible(WindowOnScreen window);
 
-    void click(WindowOnScreen window, int x, int y);
+    void click(WindowOnScreen window, int x, int y, int times = 1);
     void clickCloseButton(WindowOnScreen window);
     void press(unsigned long keysym, std::chrono::milliseconds howLong = {});
 

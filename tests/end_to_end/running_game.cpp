@@ -41,13 +41,13 @@ void RunningGame::start() {
     std::this_thread::sleep_for(500ms);
 }
 
-void RunningGame::choose(int button) {
-    desktop_.click(window_, 337, 15 + button * 52 + 2);
+void RunningGame::choose(int button, int clicks) {
+    desktop_.click(window_, 337, 15 + button * 52 + 2, clicks);
 }
 
-void RunningGame::begin(GameMode mode) {
+void RunningGame::begin(GameMode mode, int clicks) {
     mode_ = mode;
-    choose(static_cast<int>(mode));
+    choose(static_cast<int>(mode), clicks);
     waitUntil("a board", [this] { return readBoard().find('?') == std::string::npos; });
 }
 

@@ -25,8 +25,8 @@ class RunningGame {
     // Comes back when the main menu is there and has the keyboard.
     void start();
     // Chooses a button of the main menu, counted from 1.
-    void choose(int button);
-    void begin(GameMode mode);  // comes back when the board is there
+    void choose(int button, int clicks = 1);
+    void begin(GameMode mode, int clicks = 1);  // comes back when the board is there
     void clickEndGame();
     void waitForExit();  // with status 0
 

@@ -83,6 +83,15 @@ class Story {
         }
     }
 
+    void aDoubleClickBeginsATrainingGameAndNoMore() {
+        for (int time = 0; time < 4; ++time) {
+            game_.begin(GameMode::Training, 2);
+            std::this_thread::sleep_for(1s);
+            require(game_.readBoard().find('.') == std::string::npos, "a full board");
+            leaveGame();
+        }
+    }
+
     void close() {
         desktop_.clickCloseButton(game_.window());
         game_.waitForExit();
@@ -151,6 +160,7 @@ int main(int argc, char** argv) {
     story.theKeyboardComesBackFromAnotherWorkspace();
     story.aDialogKeepsTheKeyboard();
     story.enterClosesOneDialogAPress();
+    story.aDoubleClickBeginsATrainingGameAndNoMore();
     story.close();
     return 0;
 }

@@ -10,7 +10,7 @@ namespace {
 using namespace std::chrono_literals;
 
 // What a window does at a click, one step after another.
-enum class Step { Pause, RunMessages, ShowDialog, Refresh, Minimise };
+enum class Step { Pause, RunMessages, ShowDialog, ChangeScreen, Refresh, Minimise };
 constexpr milliseconds stepPause = 100ms;
 
 // A window that writes down what happens to it.
@@ -32,6 +32,7 @@ class Page final : public Window {
         ~Ending() { page.note("done"); }
     };
 
+    int screen() const override { return screen_; }
     void Form_Load() override { setClientSize({10, 10}); }
     void Form_Unload() override { note("unload"); }
     bool Form_Terminate() override {
@@ -51,6 +52,9 @@ class Page final : public Window {
                     break;
                 case Step::ShowDialog:
                     co_await loop().showModal(*dialog_);
+                    break;
+                case Step::ChangeScreen:
+                    ++screen_;
                     break;
                 case Step::Refresh:
                     refresh();
@@ -75,6 +79,7 @@ class Page final : public Window {
     std::string& log_;
     std::string name_;
     Window* dialog_;
+    int screen_ = 0;
 };
 
 class MessageLoopTest : public testing::Test {
@@ -149,6 +154,19 @@ TEST_F(MessageLoopTest, AHandlerGoesOnWhenItsWindowHasClosed) {
 TEST_F(MessageLoopTest, WhatHappensInsideACallOfTheFrontEndIsDeliveredAfterwards) {
     click(main, {Step::Minimise, Step::Refresh});
     EXPECT_EQ(logAfter(0ms), "main:click main:done main:minimised ");
+}
+
+TEST_F(MessageLoopTest, TheSecondPressOfADoubleClickIsNotMeantForWhatTheFirstOneBrought) {
+    user.doubleClick(5, 5);
+    EXPECT_EQ(logAfter(0ms), "main:click main:done main:click main:done ") << "nothing came";
+    main.atNextClick = {Step::ChangeScreen};
+    user.doubleClick(5, 5);
+    EXPECT_EQ(logAfter(0ms), "main:click main:done ") << "another screen came";
+    main.atNextClick = {Step::ShowDialog};
+    user.doubleClick(5, 5);
+    EXPECT_EQ(logAfter(0ms), "main:click ") << "a dialog came";
+    user.click(5, 5);
+    EXPECT_EQ(logAfter(0ms), "dialog:click dialog:done ") << "a click of its own";
 }
 
 TEST_F(MessageLoopTest, EndsHoweverDeepItWaits) {

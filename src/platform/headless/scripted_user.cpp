@@ -16,6 +16,15 @@ void ScriptedUser::drag(float fromX, float fromY, float toX, float toY) {
     follow(EventKind::MouseUp);
 }
 
+void ScriptedUser::doubleClick(float x, float y) {
+    click(x, y);
+    const InputEvent second{
+        .window = topWindow(), .kind = EventKind::MouseDown, .x = x, .y = y, .continuesClick = true};
+    loop_.post(second);
+    loop_.wake();
+    act(EventKind::MouseUp, x, y);
+}
+
 void ScriptedUser::press(std::int16_t key) {
     loop_.post({.window = topWindow(), .kind = EventKind::KeyPress, .key = key});
     loop_.wake();

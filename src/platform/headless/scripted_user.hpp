@@ -16,6 +16,7 @@ class ScriptedUser {
     ScriptedUser(HeadlessFrontEnd& frontEnd, MessageLoop& loop) : frontEnd_(frontEnd), loop_(loop) {}
 
     void click(float x, float y) { drag(x, y, x, y); }
+    void doubleClick(float x, float y);
     // Presses the mouse button at one place and lets go of it at another.
     void drag(float fromX, float fromY, float toX, float toY);
     void movePointer(float x, float y) { act(EventKind::MouseMove, x, y); }

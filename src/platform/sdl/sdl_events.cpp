@@ -119,8 +119,11 @@ std::optional<InputEvent> translateWindowEvent(const SDL_WindowEvent& event) {
 
 std::optional<InputEvent> translate(const SDL_Event& event) {
     switch (event.type) {
-        case SDL_MOUSEBUTTONDOWN:
-            return mouseEvent(EventKind::MouseDown, event.button.x, event.button.y);
+        case SDL_MOUSEBUTTONDOWN: {
+            InputEvent press = mouseEvent(EventKind::MouseDown, event.button.x, event.button.y);
+            press.continuesClick = event.button.clicks > 1;
+            return press;
+        }
         case SDL_MOUSEBUTTONUP:
             return mouseEvent(EventKind::MouseUp, event.button.x, event.button.y);
         case SDL_MOUSEMOTION:
