@@ -141,6 +141,11 @@ void Desktop::showWorkspace(int number) {
     askWindowManager(root_, "_NET_CURRENT_DESKTOP", number);
 }
 
+void Desktop::destroy(::Window window) {
+    XDestroyWindow(display_, window);
+    XSync(display_, False);
+}
+
 // A message of the Extended Window Manager Hints.
 void Desktop::askWindowManager(::Window window, const char* what, long first) {
     XEvent message{};

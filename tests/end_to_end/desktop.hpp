@@ -33,6 +33,7 @@ class Desktop {
     void minimise(WindowOnScreen window);
     // As a task bar does; comes back when the window is seen.
     void restore(WindowOnScreen window);
+    void destroy(WindowOnScreen window);
     void showWorkspace(int number);  // counted from 0
 
     void type(const std::string& lowerCaseLetters);

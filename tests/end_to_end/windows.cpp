@@ -3,9 +3,12 @@
 #include <X11/keysym.h>
 
 #include <chrono>
+#include <cstdlib>
+#include <filesystem>
 #include <string>
 #include <thread>
 
+#include "../support/files.hpp"
 #include "desktop.hpp"
 #include "gfx/palette.hpp"
 #include "player.hpp"
@@ -92,6 +95,21 @@ class Story {
         }
     }
 
+    void aDestroyedDialogWasClosedAndADestroyedMainWindowEndsTheProgram() {
+        game_.begin(GameMode::Strategy);
+        beginMove();
+        game_.clickEndGame();
+        desktop_.destroy(desktop_.waitForWindow("Game Statistics"));
+        desktop_.waitForFocus(desktop_.waitForWindow("Best Score"));
+        desktop_.type("survivor");
+        closeDialog("Best Score");
+        desktop_.waitForWindow("Best Scores - Quabble");
+        desktop_.destroy(game_.window());
+        game_.waitForExit();
+        const std::filesystem::path kept(std::getenv("XDG_DATA_HOME"));
+        require(bytesOf(kept / "quabble/registry.db").find("survivor") != std::string::npos, "kept settings");
+    }
+
     void close() {
         desktop_.clickCloseButton(game_.window());
         game_.waitForExit();
@@ -162,5 +180,6 @@ int main(int argc, char** argv) {
     story.enterClosesOneDialogAPress();
     story.aDoubleClickBeginsATrainingGameAndNoMore();
     story.close();
+    quabble::Story(argv[1]).aDestroyedDialogWasClosedAndADestroyedMainWindowEndsTheProgram();
     return 0;
 }

@@ -53,6 +53,12 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
     }
 }
 
+// SDL hides a window first and waits until the server says so.
+DesktopWindow::~DesktopWindow() {
+    if (isLost_)
+        X11Window::of(sdl())->reportHidden();
+}
+
 // Where the desktop scales windows by itself, on Wayland, it says so by the size of the window's surface.
 double DesktopWindow::scaleOf(const NativeWindow& traits) const {
     const auto x11 = X11Window::of(sdl());

@@ -19,6 +19,10 @@ class DesktopWindow {
  public:
     DesktopWindow(const NativeWindow& traits, const DesktopWindow* owner, std::span<const Icon> icons);
 
+    ~DesktopWindow();
+    DesktopWindow(const DesktopWindow&) = delete;
+    DesktopWindow& operator=(const DesktopWindow&) = delete;
+
     SDL_Window* sdl() const { return window_.get(); }
     std::uint32_t sdlId() const;  // 0 when the desktop had no window to give
 
@@ -29,6 +33,8 @@ class DesktopWindow {
     void showAgain();
 
     void takeKeyboard();
+    // Another program has destroyed it.
+    void setLost() { isLost_ = true; }
 
     // From the desktop's coordinates within the window to the program's pixels, and back.
     Point programPixel(Point place) const;
@@ -50,6 +56,7 @@ class DesktopWindow {
     const Surface* picture_ = nullptr;
     std::unique_ptr<SharedPicture> shared_;  // or else it is shown by SDL's window surface
     Magnifier magnifier_;
+    bool isLost_ = false;
     bool isOpened_ = false;  // from then on it is the desktop's to hide it and to bring it back
 };
 

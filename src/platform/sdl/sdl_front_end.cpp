@@ -103,7 +103,7 @@ std::optional<Clock::duration> SdlFrontEnd::timeLeft(const MessageLoop& loop) {
 
 void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
     if (const auto reported = translateX11(event)) {
-        take(*reported);
+        take(*reported, loop);
         return;
     }
     const WindowId window = idOf(windowOf(event));
@@ -139,7 +139,7 @@ void SdlFrontEnd::handOnKeyboard(const MessageLoop& loop) {
         dialog->takeKeyboard();
 }
 
-void SdlFrontEnd::take(const X11Event& event) {
+void SdlFrontEnd::take(const X11Event& event, MessageLoop& loop) {
     switch (event.kind) {
         case X11Event::Kind::KeyboardGained:
             heldKeys_.changeWindow();
@@ -153,7 +153,22 @@ void SdlFrontEnd::take(const X11Event& event) {
         case X11Event::Kind::KeyReleased:
             heldKeys_.release(event.key);
             break;
+        case X11Event::Kind::WindowDestroyed:
+            if (const WindowId window = idOfX11(event.window); window != WindowId::none)
+                lose(window, loop);
+            break;
     }
+}
+
+// Somebody else has destroyed a window. For a dialog that is closing it; without its main window the program
+// ends.
+void SdlFrontEnd::lose(WindowId window, MessageLoop& loop) {
+    windows_.at(window)->setLost();
+    const Window* modal = loop.modalWindow();
+    if (modal != nullptr && modal->id() == window)
+        loop.post({.window = window, .kind = EventKind::CloseButton});
+    else
+        loop.requestEnd();
 }
 
 void SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
@@ -232,6 +247,14 @@ DesktopWindow* SdlFrontEnd::find(WindowId window) {
 WindowId SdlFrontEnd::idOf(std::uint32_t sdlWindow) const {
     const auto found = std::ranges::find_if(
         windows_, [&](const auto& window) { return sdlWindow != 0 && window.second->sdlId() == sdlWindow; });
+    return found == windows_.end() ? WindowId::none : found->first;
+}
+
+WindowId SdlFrontEnd::idOfX11(unsigned long x11Window) const {
+    const auto found = std::ranges::find_if(windows_, [&](const auto& window) {
+        const auto x11 = X11Window::of(window.second->sdl());
+        return x11 && x11->id() == x11Window;
+    });
     return found == windows_.end() ? WindowId::none : found->first;
 }
 

@@ -46,11 +46,13 @@ class SdlFrontEnd final : public FrontEnd {
     SdlFrontEnd() = default;
     DesktopWindow* find(WindowId window);
     WindowId idOf(std::uint32_t sdlWindow) const;
+    WindowId idOfX11(unsigned long x11Window) const;
     void waitForEvents(MessageLoop& loop);
     std::optional<Clock::duration> timeLeft(const MessageLoop& loop);
     void take(const SDL_Event& event, MessageLoop& loop);
     void handOnKeyboard(const MessageLoop& loop);
-    void take(const X11Event& event);
+    void take(const X11Event& event, MessageLoop& loop);
+    void lose(WindowId window, MessageLoop& loop);
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
     std::vector<Icon> icons_;

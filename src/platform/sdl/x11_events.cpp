@@ -32,6 +32,8 @@ std::optional<X11Event> translateX11(const SDL_Event& event) {
             return X11Event{.kind = Kind::KeyPressed, .window = x11.xkey.window, .key = x11.xkey.keycode};
         case KeyRelease:
             return X11Event{.kind = Kind::KeyReleased, .window = x11.xkey.window, .key = x11.xkey.keycode};
+        case DestroyNotify:
+            return X11Event{.kind = Kind::WindowDestroyed, .window = x11.xdestroywindow.window};
         default:
             return std::nullopt;
     }

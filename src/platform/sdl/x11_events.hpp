@@ -14,7 +14,8 @@ struct X11Event {
         KeyboardGained,  // by a window; KeysDown follows
         KeysDown,
         KeyPressed,  // or repeated
-        KeyReleased
+        KeyReleased,
+        WindowDestroyed  // by whomever
     };
     Kind kind;
     unsigned long window = 0;  // the server's number

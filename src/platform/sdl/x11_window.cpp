@@ -101,6 +101,14 @@ void X11Window::beModal() const {
                     PropModeAppend, reinterpret_cast<const unsigned char*>(&modal), 1);
 }
 
+void X11Window::reportHidden() const {
+    XEvent event{};
+    event.type = UnmapNotify;
+    event.xunmap.display = display_;
+    event.xunmap.event = event.xunmap.window = window_;
+    XPutBackEvent(display_, &event);
+}
+
 // Each is its width and height and then its pixels, opacity first: the format of the Extended Window Manager
 // Hints.
 void X11Window::setIcons(std::span<const Icon> icons) const {

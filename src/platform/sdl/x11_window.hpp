@@ -34,6 +34,9 @@ class X11Window {
     void haveOnlyCloseButton() const;
     // Tells the window manager of a dialog that is not shown yet: its owner takes no keyboard meanwhile.
     void beModal() const;
+    // Says in the server's stead that the window is hidden, to whoever waits for that. It was destroyed by
+    // another program, and the server says nothing of it any more.
+    void reportHidden() const;
     void setIcons(std::span<const Icon> icons) const;
 
  private:
