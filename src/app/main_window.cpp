@@ -84,6 +84,14 @@ int MainWindow::screen() const {
     return gamePaused_ ? PausedGame : Game;
 }
 
+bool MainWindow::isClickable(float x, float y) const {
+    if (app_.game.mainMenuActive)
+        return buttonAt(mmBtns_, x, y).has_value();
+    if (app_.game.classicActive)
+        return buttonAt(standardBtns_, x, y).has_value();
+    return app_.game.arcadeActive && (buttonAt(arcadeBtns_, x, y) || hitTest(previewBox_, x, y));
+}
+
 Task<> MainWindow::Form_MouseDown(float x, float y) {
     if (gamePaused_) {
         enablePause(false);

@@ -38,6 +38,7 @@ class MainWindow final : public Window, private Stage {
     Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;
     int screen() const override;
+    bool isClickable(float x, float y) const override;
     Task<> clickBoard(float x, float y);
     Task<> lblPause_Click();
     Task<> timerBlocks_Timer();

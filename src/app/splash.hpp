@@ -18,6 +18,7 @@ class Splash final : public Window {
 
  private:
     void Form_Load() override;
+    bool isClickable(float x, float y) const override { return hitTest(taglineBox_, x, y); }
     Task<> Form_MouseDown(float x, float y) override;
     Task<> splashTimer_Timer();
 

@@ -29,6 +29,8 @@ class Control {
     // Whoever takes the focus also hears, after a press, where the button was let go.
     virtual Task<> mouseUp(Point at);
 
+    // Whether it is there to be clicked, which the pointer's shape tells.
+    virtual bool isClickable() const { return false; }
     virtual bool takesFocus() const { return false; }
     virtual bool takesText() const { return false; }
     // A key that the control with the focus may act on; false when it means nothing to it.
@@ -55,6 +57,7 @@ class Label final : public Control {
 
     void paint(Surface& surface, bool hasFocus) const override;
     Task<> mouseDown(Point, bool) override { return onClick(); }
+    bool isClickable() const override { return true; }
 };
 
 // A button whose look is drawn on the window's picture; the control adds the ring of the focus.
@@ -67,6 +70,7 @@ class PushButton final : public Control {
     void paint(Surface& surface, bool hasFocus) const override;
     Task<> mouseDown(Point at, bool extends) override;
     Task<> mouseUp(Point at) override;
+    bool isClickable() const override { return true; }
     bool takesFocus() const override { return true; }
     bool takesKey(std::int16_t key) const override { return key == keys::space; }
     Task<> keyPress(std::int16_t) override { return onClick(); }

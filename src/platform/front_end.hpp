@@ -27,6 +27,8 @@ struct NativeWindow {
     WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner and centres on it
 };
 
+enum class PointerShape { Arrow, Hand };
+
 // A small picture that stands for the program, four bytes a pixel: red, green, blue and opacity.
 struct Icon {
     Size size;
@@ -49,6 +51,8 @@ class FrontEnd {
     virtual void closeWindow(WindowId window) = 0;
     // Asks for the window to be minimised; an event reports when it is.
     virtual void minimiseWindow(WindowId /*window*/) {}
+    // How the pointer looks over the window; at first it is an arrow.
+    virtual void setPointer(WindowId /*window*/, PointerShape /*shape*/) {}
     // The icon, in several sizes, of all windows that are made from now on.
     virtual void setIcons(std::span<const Icon> /*icons*/) {}
     // Of the first screen.

@@ -19,12 +19,21 @@ Task<> MessageLoop::showModal(Window& window) {
     window.show();
     {
         const ModalWindow modal(*this, window);
+        tellPointers();
         while (window.isShown()) {
             co_await nextMessage();
             co_await deliverOne();
         }
     }
+    tellPointers();
     co_await pause(milliseconds::zero());
+}
+
+void MessageLoop::tellPointers() {
+    for (Window* window : windows_) {
+        if (window->isShown())
+            window->tellPointer();
+    }
 }
 
 Task<> MessageLoop::run() {

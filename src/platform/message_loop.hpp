@@ -107,6 +107,7 @@ class MessageLoop {
     Timer* firstDueTimer() const;
     Task<> deliverOne();
     Task<> deliver(InputEvent event);
+    void tellPointers();
     bool isMeant(const InputEvent& press, const Window& window);
     Wait nextMessage() { return Wait{*this, std::nullopt}; }
     Window* findWindow(WindowId id) const;

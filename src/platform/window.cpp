@@ -31,6 +31,8 @@ void Window::show() {
     state_ = State::Normal;
     focus_ = nullptr;
     pressed_ = nullptr;
+    pointerX_ = pointerY_ = -1;
+    pointer_ = PointerShape::Arrow;
     id_ = static_cast<WindowId>(++loop_.lastWindowId_);
     Form_Load();
     traits_.owner = owner_ == nullptr ? WindowId::none : owner_->id_;
@@ -51,6 +53,7 @@ void Window::unload() {
 void Window::refresh() {
     if (!shown_)
         return;
+    tellPointer();
     const bool covered =
         std::ranges::any_of(controls_, [](const Control* control) { return control->visible; });
     if (!covered) {
@@ -94,6 +97,19 @@ void Window::tellWhereTextIsTyped() {
     loop_.frontEnd().setTextInput(id_, takesText ? std::optional(focus_->area) : std::nullopt);
 }
 
+// What is below a dialog cannot be clicked.
+void Window::tellPointer() {
+    const Point at{static_cast<std::int32_t>(std::floor(pointerX_)),
+                   static_cast<std::int32_t>(std::floor(pointerY_))};
+    const Control* control = controlAt(at);
+    const bool takesInput = loop_.modalWindow() == nullptr || loop_.modalWindow() == this;
+    const bool isHand =
+        takesInput && (control == nullptr ? isClickable(pointerX_, pointerY_) : control->isClickable());
+    const PointerShape shape = isHand ? PointerShape::Hand : PointerShape::Arrow;
+    if (shape != std::exchange(pointer_, shape))
+        loop_.frontEnd().setPointer(id_, shape);
+}
+
 Task<> Window::handle(InputEvent event) {
     const Point at{static_cast<std::int32_t>(std::floor(event.x)),
                    static_cast<std::int32_t>(std::floor(event.y))};
@@ -105,6 +121,9 @@ Task<> Window::handle(InputEvent event) {
                 co_await Form_MouseDown(event.x, event.y);
             break;
         case EventKind::MouseMove:
+            pointerX_ = event.x;
+            pointerY_ = event.y;
+            tellPointer();
             if (pressed_ != nullptr)
                 dragControl(at);
             else if (controlAt(at) == nullptr)

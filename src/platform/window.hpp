@@ -62,6 +62,8 @@ class Window {
 
     // Which of its screens is shown, as a number, by a window that has several.
     virtual int screen() const { return 0; }
+    // Whether the picture has something there that is to be clicked: the pointer is a hand above it.
+    virtual bool isClickable(float /*x*/, float /*y*/) const { return false; }
     virtual void Form_Load() {}
     // The user wants the window to close; this unloads it.
     virtual Task<> Form_QueryUnload();
@@ -85,6 +87,7 @@ class Window {
     void editText(const InputEvent& event);
     void focusNext();
     void tellWhereTextIsTyped();
+    void tellPointer();
 
     MessageLoop& loop_;
     Window* owner_;
@@ -95,6 +98,9 @@ class Window {
     std::vector<Control*> controls_;
     Control* focus_ = nullptr;
     Control* pressed_ = nullptr;  // the control on which the mouse button went down
+    float pointerX_ = -1;         // where the pointer was seen last
+    float pointerY_ = -1;
+    PointerShape pointer_ = PointerShape::Arrow;
     bool shown_ = false;
     State state_ = State::Normal;
 };

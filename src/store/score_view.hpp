@@ -19,6 +19,9 @@ class ScoreView final : public Window {
 
  private:
     void Form_Load() override;
+    bool isClickable(float x, float y) const override {
+        return hitTest(buttons_[0], x, y) || hitTest(buttons_[1], x, y);
+    }
     Task<> Form_MouseDown(float x, float y) override;
     Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;

@@ -63,6 +63,38 @@ TEST(MainMenu, HighlightsTheButtonUnderThePointer) {
     EXPECT_TRUE(isFramed(105) && machine.shown().minimised && !machine.isPaused()) << "the menu only hides";
 }
 
+TEST(Pointer, IsAHandOverWhatCanBeClicked) {
+    Machine machine;
+    const auto isHandAt = [&](float x, float y) {
+        machine.user.movePointer(x, y);
+        return machine.user.top().pointer == PointerShape::Hand;
+    };
+    EXPECT_TRUE(isHandAt(337, 67)) << "Training Game";
+    EXPECT_FALSE(isHandAt(337, 95)) << "between two buttons";
+    machine.pointAtMenu(4);
+    machine.clickMenu(4);
+    EXPECT_EQ(machine.shown().pointer, PointerShape::Arrow) << "below a dialog";
+    EXPECT_TRUE(isHandAt(100, 420)) << "the button that closes the scores";
+    EXPECT_FALSE(isHandAt(100, 200));
+    machine.closeDialog();
+    EXPECT_EQ(machine.shown().pointer, PointerShape::Hand) << "again above the menu";
+
+    machine.pointAtMenu(3);
+    machine.clickMenu(3);
+    EXPECT_EQ(machine.shown().pointer, PointerShape::Arrow) << "a board came where the menu was";
+    EXPECT_FALSE(isHandAt(95, 190)) << "a value";
+    EXPECT_TRUE(isHandAt(95, 425)) << "Help";
+    EXPECT_TRUE(isHandAt(400, 515)) << "the waiting row";
+    machine.clickPanel(8);
+    EXPECT_TRUE(isHandAt(10, 10)) << "the pause notice";
+    machine.user.click(10, 10);
+    EXPECT_EQ(machine.shown().pointer, PointerShape::Arrow);
+
+    machine.clickPanel(10);
+    EXPECT_FALSE(isHandAt(200, 100));
+    EXPECT_TRUE(isHandAt(230, 215)) << "OK";
+}
+
 TEST(TrainingGame, ShowsAMoveStepByStepAndEndsAfterTheLastOne) {
     MachineInAMove machine(1, 0ms, lastCluster);
     using Moment = std::tuple<milliseconds, const char*, bool>;

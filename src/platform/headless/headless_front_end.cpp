@@ -3,7 +3,7 @@
 namespace quabble {
 
 void HeadlessFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
-    windows_[window] = {traits, Surface(traits.clientSize.width, traits.clientSize.height), 0, false, false};
+    windows_[window] = {traits, Surface(traits.clientSize.width, traits.clientSize.height)};
 }
 
 void HeadlessFrontEnd::showPixels(WindowId window, const Surface& picture) {

@@ -19,6 +19,7 @@ class HeadlessFrontEnd final : public FrontEnd {
         int timesShown = 0;
         bool minimised = false;
         bool takesText = false;
+        PointerShape pointer = PointerShape::Arrow;
     };
 
     explicit HeadlessFrontEnd(std::string folder) : executableFolder_(std::move(folder)) {}
@@ -31,6 +32,7 @@ class HeadlessFrontEnd final : public FrontEnd {
     void showPixels(WindowId window, const Surface& picture) override;
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
+    void setPointer(WindowId window, PointerShape shape) override { windows_.at(window).pointer = shape; }
     void openDocument(const std::string& document, const std::string& folder) override {
         openedDocuments.push_back(document + " in " + folder);
     }

@@ -36,6 +36,9 @@ class DesktopWindow {
     // Another program has destroyed it.
     void setLost() { isLost_ = true; }
 
+    PointerShape pointer() const { return pointer_; }  // above the window
+    void setPointer(PointerShape shape) { pointer_ = shape; }
+
     // From the desktop's coordinates within the window to the program's pixels, and back.
     Point programPixel(Point place) const;
     Rect placeOf(const Rect& programPixels) const;
@@ -57,6 +60,7 @@ class DesktopWindow {
     std::unique_ptr<SharedPicture> shared_;  // or else it is shown by SDL's window surface
     Magnifier magnifier_;
     bool isLost_ = false;
+    PointerShape pointer_ = PointerShape::Arrow;
     bool isOpened_ = false;  // from then on it is the desktop's to hide it and to bring it back
 };
 

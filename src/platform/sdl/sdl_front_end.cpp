@@ -116,6 +116,8 @@ void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
     if (event.type == SDL_WINDOWEVENT &&
         (event.window.event == SDL_WINDOWEVENT_FOCUS_GAINED || event.window.event == SDL_WINDOWEVENT_SHOWN))
         handOnKeyboard(loop);
+    if (event.type == SDL_WINDOWEVENT && event.window.event == SDL_WINDOWEVENT_ENTER && shown != nullptr)
+        showPointerOf(*shown);
     const bool isTyped = event.type == SDL_KEYDOWN || event.type == SDL_TEXTINPUT;
     auto input = translate(event);
     if (!input || (isTyped && !heldKeys_.isMeant()))
@@ -193,6 +195,23 @@ void SdlFrontEnd::closeWindow(WindowId window) {
 void SdlFrontEnd::minimiseWindow(WindowId window) {
     if (const DesktopWindow* shown = find(window))
         SDL_MinimizeWindow(shown->sdl());
+}
+
+void SdlFrontEnd::setPointer(WindowId window, PointerShape shape) {
+    DesktopWindow* shown = find(window);
+    if (shown == nullptr)
+        return;
+    shown->setPointer(shape);
+    if (SDL_GetMouseFocus() == shown->sdl())
+        showPointerOf(*shown);
+}
+
+// SDL knows one pointer for all windows.
+void SdlFrontEnd::showPointerOf(const DesktopWindow& window) {
+    const bool isHand = window.pointer() == PointerShape::Hand;
+    if (isHand && hand_ == nullptr)
+        hand_ = SDL_CreateSystemCursor(SDL_SYSTEM_CURSOR_HAND);
+    SDL_SetCursor(isHand && hand_ != nullptr ? hand_ : SDL_GetDefaultCursor());
 }
 
 void SdlFrontEnd::setIcons(std::span<const Icon> icons) {

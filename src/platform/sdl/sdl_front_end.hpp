@@ -13,6 +13,7 @@
 #include "platform/sdl/held_keys.hpp"
 #include "platform/sdl/x11_events.hpp"
 
+struct SDL_Cursor;
 union SDL_Event;
 
 namespace quabble {
@@ -34,6 +35,7 @@ class SdlFrontEnd final : public FrontEnd {
     void showPixels(WindowId window, const Surface& picture) override;
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
+    void setPointer(WindowId window, PointerShape shape) override;
     void setIcons(std::span<const Icon> icons) override;
     void openDocument(const std::string& document, const std::string& folder) override;
     void setTextInput(WindowId window, std::optional<Rect> area) override;
@@ -50,6 +52,7 @@ class SdlFrontEnd final : public FrontEnd {
     void waitForEvents(MessageLoop& loop);
     std::optional<Clock::duration> timeLeft(const MessageLoop& loop);
     void take(const SDL_Event& event, MessageLoop& loop);
+    void showPointerOf(const DesktopWindow& window);
     void handOnKeyboard(const MessageLoop& loop);
     void take(const X11Event& event, MessageLoop& loop);
     void lose(WindowId window, MessageLoop& loop);
@@ -59,6 +62,7 @@ class SdlFrontEnd final : public FrontEnd {
     std::vector<WindowId> unopened_;  // for want of a place on the desktop; they close at once
     DesktopWait desktopWait_;
     HeldKeys heldKeys_;
+    SDL_Cursor* hand_ = nullptr;  // made when it is first shown; SDL frees it when it quits
 };
 
 }  // namespace quabble
