@@ -16,6 +16,7 @@ class MessageDialog final : public Window {
 
  private:
     void Form_Load() override;
+    bool isClickable(float x, float y) const override { return hitTest(okBox_, x, y); }
     Task<> Form_MouseDown(float x, float y) override;
     Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;

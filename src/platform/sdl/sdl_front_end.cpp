@@ -170,7 +170,7 @@ void SdlFrontEnd::lose(WindowId window, MessageLoop& loop) {
     if (modal != nullptr && modal->id() == window)
         loop.post({.window = window, .kind = EventKind::CloseButton});
     else
-        loop.requestEnd();
+        end(loop);
 }
 
 void SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
