@@ -29,7 +29,7 @@ void waitUntil(const std::string& what, const std::function<bool()>& isSo) {
     const auto end = std::chrono::steady_clock::now() + patience;
     while (!isSo()) {
         require(std::chrono::steady_clock::now() < end, "waited in vain: " + what);
-        std::this_thread::sleep_for(10ms);
+        std::this_thread::sleep_for(1ms);
     }
 }
 

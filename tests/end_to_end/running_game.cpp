@@ -10,6 +10,7 @@
 
 #include "../engine/board_notation.hpp"
 #include "gfx/painters.hpp"
+#include "gfx/palette.hpp"
 #include "gfx/sprite_sheet.hpp"
 
 namespace quabble {
@@ -37,6 +38,7 @@ void RunningGame::start() {
         _exit(127);
     }
     window_ = desktop_.waitForWindow("Quabble  Ver 1.0");
+    require(look().at(2, 2) == palette::backgroundColour, "a picture from the first");
     desktop_.waitForFocus(window_);
     std::this_thread::sleep_for(500ms);
 }

@@ -3,6 +3,7 @@
 #include <X11/keysym.h>
 
 #include <chrono>
+#include <csignal>
 #include <cstdlib>
 #include <filesystem>
 #include <string>
@@ -110,6 +111,16 @@ class Story {
         require(bytesOf(kept / "quabble/registry.db").find("survivor") != std::string::npos, "kept settings");
     }
 
+    void aRestoredWindowHasItsPictureAtOnce() {
+        std::this_thread::sleep_for(500ms);  // until the pointer has lit up what it rests on
+        const Surface before = game_.look();
+        desktop_.minimise(game_.window());
+        kill(game_.process(), SIGSTOP);
+        desktop_.restore(game_.window());
+        waitUntil("a picture that the program need not draw again", [&] { return game_.look() == before; });
+        kill(game_.process(), SIGCONT);
+    }
+
     void close() {
         desktop_.clickCloseButton(game_.window());
         game_.waitForExit();
@@ -179,6 +190,7 @@ int main(int argc, char** argv) {
     story.aDialogKeepsTheKeyboard();
     story.enterClosesOneDialogAPress();
     story.aDoubleClickBeginsATrainingGameAndNoMore();
+    story.aRestoredWindowHasItsPictureAtOnce();
     story.close();
     quabble::Story(argv[1]).aDestroyedDialogWasClosedAndADestroyedMainWindowEndsTheProgram();
     return 0;

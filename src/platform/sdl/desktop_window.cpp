@@ -48,8 +48,7 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
             x11->haveOnlyCloseButton();
             x11->beModal();
         }
-        if (size == clientSize_)
-            shared_ = SharedPicture::of(*x11, size);
+        shared_ = SharedPicture::of(*x11, size);
     }
 }
 
@@ -97,48 +96,50 @@ void DesktopWindow::show(const Surface& picture) {
     picture_ = &picture;
     if (!window_)
         return;
+    if (shared_)
+        shared_->show(picture, magnifierFor(picture, shared_->size()));
     if (!std::exchange(isOpened_, true)) {
         if (!shared_)
             SDL_GetWindowSurface(sdl());  // for which SDL makes a Wayland window anew; that is not to be seen
         SDL_ShowWindow(sdl());
     }
     if (shared_)
-        shared_->set(picture);
-    else if (SDL_Surface* screen = SDL_GetWindowSurface(sdl()))
-        fill(*screen, picture);
-    update();
-}
-
-void DesktopWindow::showAgain() {
-    if (picture_ == nullptr)
         return;
-    if (shared_ && size() != clientSize_)
-        shared_.reset();
-    if (!update())
-        show(*picture_);
+    if (SDL_Surface* screen = SDL_GetWindowSurface(sdl()))
+        fill(*screen, picture);
+    SDL_UpdateWindowSurface(sdl());
 }
 
-// False when SDL's window surface, which still had the picture, is no longer of the window's size.
-bool DesktopWindow::update() {
-    if (!shared_)
-        return SDL_UpdateWindowSurface(sdl()) == 0;
-    shared_->show();
-    return true;
+// A shared picture is shown again by the server as long as the window keeps its size, and SDL's window
+// surface has kept the picture.
+void DesktopWindow::showAgain() {
+    if (picture_ == nullptr || (shared_ && shared_->size() == size()))
+        return;
+    if (shared_)
+        shared_ = SharedPicture::of(*X11Window::of(sdl()), size());
+    else if (SDL_UpdateWindowSurface(sdl()) == 0)
+        return;
+    show(*picture_);
+}
+
+Magnifier& DesktopWindow::magnifierFor(const Surface& picture, Size shown) {
+    if (magnifier_.shownSize() != shown)
+        magnifier_ = Magnifier({picture.width(), picture.height()}, shown);
+    return magnifier_;
 }
 
 void DesktopWindow::fill(SDL_Surface& screen, const Surface& picture) {
     const Size shown{screen.w, screen.h};
-    if (magnifier_.shownSize() != shown)
-        magnifier_ = Magnifier({picture.width(), picture.height()}, shown);
+    Magnifier& magnifier = magnifierFor(picture, shown);
     const bool isOfOurFormat = screen.format->BytesPerPixel == 4 && screen.format->Rmask == 0xFF0000 &&
                                screen.format->Gmask == 0xFF00 && screen.format->Bmask == 0xFF;
     if (isOfOurFormat) {
-        magnifier_.show(picture, static_cast<std::uint32_t*>(screen.pixels), screen.pitch);
+        magnifier.show(picture, static_cast<std::uint32_t*>(screen.pixels), screen.pitch);
         return;
     }
     Surface whole(shown.width, shown.height);
     const int stride = shown.width * static_cast<int>(sizeof(std::uint32_t));
-    magnifier_.show(picture, whole.row(0).data(), stride);
+    magnifier.show(picture, whole.row(0).data(), stride);
     SDL_Surface* source = SDL_CreateRGBSurfaceWithFormatFrom(whole.row(0).data(), shown.width, shown.height,
                                                              32, stride, SDL_PIXELFORMAT_RGB888);
     SDL_BlitSurface(source, nullptr, &screen, nullptr);

@@ -47,7 +47,7 @@ class DesktopWindow {
     Size size() const;  // in the desktop's coordinates
     double scaleOf(const NativeWindow& traits) const;
     Point positionOf(const NativeWindow& traits, const DesktopWindow* owner) const;
-    bool update();
+    Magnifier& magnifierFor(const Surface& picture, Size shown);
     void fill(SDL_Surface& screen, const Surface& picture);
 
     struct Destroy {

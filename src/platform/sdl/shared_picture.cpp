@@ -8,7 +8,6 @@
 
 #include <bit>
 #include <cstdint>
-#include <cstring>
 #include <utility>
 
 namespace quabble {
@@ -34,6 +33,7 @@ struct SharedPicture::Segment {
     Display* display;
     ::Window window;
     GC context = nullptr;
+    Pixmap background = 0;
     XImage* image = nullptr;
     XShmSegmentInfo info{};
     bool isAttached = false;
@@ -48,6 +48,8 @@ SharedPicture::Segment::~Segment() {
         image->data = nullptr;  // which lay in the segment
         XDestroyImage(image);
     }
+    if (background != 0)
+        XFreePixmap(display, background);
     if (context != nullptr)
         XFreeGC(display, context);
 }
@@ -76,6 +78,7 @@ bool SharedPicture::Segment::make(Size size) {
     return isAttached;
 }
 
+// Gets what the server has to have for the picture, which it may refuse.
 bool SharedPicture::Segment::attach() {
     static bool isRefused;
     isRefused = false;
@@ -85,6 +88,8 @@ bool SharedPicture::Segment::attach() {
         return 0;
     });
     XShmAttach(display, &info);
+    background = XCreatePixmap(display, window, static_cast<unsigned>(image->width),
+                               static_cast<unsigned>(image->height), static_cast<unsigned>(image->depth));
     XSync(display, False);
     XSetErrorHandler(before);
     return !isRefused;
@@ -101,19 +106,18 @@ SharedPicture::SharedPicture(std::unique_ptr<Segment> segment) : segment_(std::m
 
 SharedPicture::~SharedPicture() = default;
 
-void SharedPicture::set(const Surface& picture) {
-    const XImage& image = *segment_->image;
-    for (std::int32_t y = 0; y < picture.height(); ++y) {
-        const auto line = picture.row(y);
-        std::memcpy(image.data + std::ptrdiff_t{y} * image.bytes_per_line, line.data(), line.size_bytes());
-    }
+Size SharedPicture::size() const {
+    return {segment_->image->width, segment_->image->height};
 }
 
-void SharedPicture::show() {
-    XImage* image = segment_->image;
-    XShmPutImage(segment_->display, segment_->window, segment_->context, image, 0, 0, 0, 0,
-                 static_cast<unsigned>(image->width), static_cast<unsigned>(image->height), False);
-    XFlush(segment_->display);
+void SharedPicture::show(const Surface& picture, Magnifier& magnifier) {
+    const Segment& own = *segment_;
+    magnifier.show(picture, reinterpret_cast<std::uint32_t*>(own.image->data), own.image->bytes_per_line);
+    XShmPutImage(own.display, own.background, own.context, own.image, 0, 0, 0, 0,
+                 static_cast<unsigned>(own.image->width), static_cast<unsigned>(own.image->height), False);
+    XSetWindowBackgroundPixmap(own.display, own.window, own.background);
+    XClearWindow(own.display, own.window);
+    XFlush(own.display);
 }
 
 }  // namespace quabble

@@ -2,6 +2,7 @@
 
 #include <memory>
 
+#include "platform/scaling.hpp"
 #include "platform/sdl/x11_window.hpp"
 #include "platform/surface.hpp"
 
@@ -9,7 +10,8 @@ namespace quabble {
 
 // A window's picture in memory that the X server reads. To show it is to ask the server, not to wait for it,
 // as SDL does for its window surface; a picture that is changed before the server has read it may be seen
-// half changed until it is shown again.
+// half changed until the next one. The server keeps a copy as the window's background and paints it by itself
+// as soon as the window, or a part of it, comes to be seen.
 class SharedPicture {
  public:
     // Nothing when the server cannot read the program's memory, as one on another machine, or shows other
@@ -19,8 +21,9 @@ class SharedPicture {
     SharedPicture(const SharedPicture&) = delete;
     SharedPicture& operator=(const SharedPicture&) = delete;
 
-    void set(const Surface& picture);  // of the size that was given
-    void show();
+    Size size() const;
+    // The magnifier makes pictures of the size that was given.
+    void show(const Surface& picture, Magnifier& magnifier);
 
  private:
     struct Segment;
