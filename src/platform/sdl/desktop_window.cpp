@@ -52,10 +52,15 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
     }
 }
 
-// SDL hides a window first and waits until the server says so.
+// SDL hides a window first and waits until the server says so. What the server refuses then must be heard before
+// SDL quits, for errors end the process after that.
 DesktopWindow::~DesktopWindow() {
-    if (isLost_)
-        X11Window::of(sdl())->reportHidden();
+    if (!isLost_)
+        return;
+    const auto x11 = X11Window::of(sdl());
+    x11->reportHidden();
+    window_.reset();
+    x11->waitForServer();
 }
 
 // Where the desktop scales windows by itself, on Wayland, it says so by the size of the window's surface.

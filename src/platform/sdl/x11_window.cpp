@@ -109,6 +109,10 @@ void X11Window::reportHidden() const {
     XPutBackEvent(display_, &event);
 }
 
+void X11Window::waitForServer() const {
+    XSync(display_, False);
+}
+
 // Each is its width and height and then its pixels, opacity first: the format of the Extended Window Manager
 // Hints.
 void X11Window::setIcons(std::span<const Icon> icons) const {

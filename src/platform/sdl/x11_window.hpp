@@ -37,6 +37,8 @@ class X11Window {
     // Says in the server's stead that the window is hidden, to whoever waits for that. It was destroyed by
     // another program, and the server says nothing of it any more.
     void reportHidden() const;
+    // Comes back when the server has answered everything that was asked of it.
+    void waitForServer() const;
     void setIcons(std::span<const Icon> icons) const;
 
  private:
