@@ -2,6 +2,7 @@
 #include <stb/stb_image.h>
 
 #include <algorithm>
+#include <functional>
 #include <memory>
 
 #include "machine.hpp"
@@ -35,7 +36,8 @@ void expectGolden(const Surface& seen, const std::string& name) {
     stbi_uc* read = stbi_load(kept.c_str(), &width, &height, nullptr, 3);
     const std::unique_ptr<stbi_uc, void (*)(void*)> golden(read, stbi_image_free);
     const auto isNear = [](int left, int right) { return std::abs(left - right) <= 8; };
-    ASSERT_TRUE(golden && width == seen.width() && height == seen.height()) << kept;
+    ASSERT_TRUE(golden) << kept;
+    ASSERT_EQ((Size{width, height}), (Size{seen.width(), seen.height()})) << kept;
     EXPECT_TRUE(std::equal(bytes.begin(), bytes.end(), golden.get(), isNear)) << "see " << written;
 }
 
@@ -51,7 +53,9 @@ TEST(MainMenu, HighlightsTheButtonUnderThePointer) {
     const int presented = machine.shown().timesShown;
     machine.pointAtMenu(2);
     machine.user.movePointer(330, 120);
-    EXPECT_TRUE(isFramed(105) && !isFramed(52) && machine.shown().timesShown == presented + 2);
+    EXPECT_TRUE(isFramed(105));
+    EXPECT_FALSE(isFramed(52));
+    EXPECT_EQ(machine.shown().timesShown, presented + 2);
     machine.clickMenu(2);
     machine.clickPanel(10);
     machine.closeDialog();
@@ -60,7 +64,9 @@ TEST(MainMenu, HighlightsTheButtonUnderThePointer) {
     machine.pointAtMenu(8);
     machine.pointAtMenu(2);
     machine.user.press('q');
-    EXPECT_TRUE(isFramed(105) && machine.shown().minimised && !machine.isPaused()) << "the menu only hides";
+    EXPECT_TRUE(isFramed(105));
+    EXPECT_TRUE(machine.shown().minimised);
+    EXPECT_FALSE(machine.isPaused()) << "the menu only hides";
 }
 
 TEST(Pointer, IsAHandOverWhatCanBeClicked) {
@@ -107,7 +113,9 @@ TEST(TrainingGame, ShowsAMoveStepByStepAndEndsAfterTheLastOne) {
         EXPECT_NE(isFlat(machine.picture(), machine.cell(5, 16)), points) << rows;
     }
     const GameStats& stats = machine.game.stats;
-    EXPECT_TRUE(machine.hasDialog() && stats.score == 6 && stats.blocksCleared == 3);
+    EXPECT_TRUE(machine.hasDialog());
+    EXPECT_EQ(stats.score, 6);
+    EXPECT_EQ(stats.blocksCleared, 3);
     machine.closeDialog();
     machine.clickMenu(1);
     EXPECT_EQ(stats.score + stats.blocksCleared + stats.largestCluster, 0)
@@ -124,10 +132,12 @@ TEST(Moves, LetEndGameActOnceWhenTheyAreDone) {
             machine.user.wait(end - at - 1ms);
             EXPECT_FALSE(machine.hasDialog());
             machine.user.wait(1ms);
-            EXPECT_TRUE(machine.hasDialog() && machine.seenBoard() == afterMove);
+            EXPECT_TRUE(machine.hasDialog());
+            EXPECT_EQ(machine.seenBoard(), afterMove);
             machine.closeDialog();
             machine.user.wait(10s);
-            EXPECT_TRUE(machine.game.mainMenuActive && !machine.hasDialog());
+            EXPECT_TRUE(machine.game.mainMenuActive);
+            EXPECT_FALSE(machine.hasDialog());
         }
     }
 }
@@ -161,13 +171,20 @@ TEST(Program, IsNotClosedBehindADialog) {
 }
 
 TEST(Pause, CoversEverythingUntilAClickThatDoesNothingElse) {
-    for (const std::string by : {"button", "key", "frame"}) {
-        SCOPED_TRACE(by);
+    struct Way {
+        const char* name;
+        std::function<void(Machine&)> pause;
+        bool minimises;
+    };
+    const Way ways[] = {{"the panel's button", [](Machine& machine) { machine.clickPanel(6); }, false},
+                        {"a key", [](Machine& machine) { machine.user.press('q'); }, true},
+                        {"the window's frame", [](Machine& machine) { machine.user.minimise(); }, true}};
+    for (const Way& way : ways) {
+        SCOPED_TRACE(way.name);
         MachineInAMove machine(1, 100ms);
-        by != "button" ? by == "key" ? machine.user.press('q') : machine.user.minimise()
-                       : machine.clickPanel(6);
+        way.pause(machine);
         machine.user.wait(1s);
-        EXPECT_EQ(machine.shown().minimised, by != "button");
+        EXPECT_EQ(machine.shown().minimised, way.minimises);
         EXPECT_EQ(machine.picture().at(674, 561), palette::pauseBackground);
         EXPECT_TRUE(isFlat(machine.picture(), {0, 0, 675, 250}));
         machine.user.press('q');
@@ -177,7 +194,8 @@ TEST(Pause, CoversEverythingUntilAClickThatDoesNothingElse) {
         const Surface beneath = machine.app.frmQuabble().canvas().picture;
         machine.user.movePointer(95, 385);
         machine.clickPanel(8);
-        EXPECT_FALSE(machine.isPaused() || machine.hasDialog());
+        EXPECT_FALSE(machine.isPaused());
+        EXPECT_FALSE(machine.hasDialog());
         EXPECT_TRUE(machine.picture() == beneath);
         EXPECT_EQ(machine.seenBoard(), afterMove) << "a move goes on behind the notice";
     }
@@ -206,16 +224,21 @@ TEST(TimedGame, UncoversAndPushesRowsUntilTheLevelIsComplete) {
                 machine.setBoard("121212121212");
             machine.user.wait(1ms);
         }
-        EXPECT_TRUE(row != 24 || (isFull(119) && !isFull(120))) << "120.5 is rounded to the even number";
+        if (row == 24) {
+            EXPECT_TRUE(isFull(119));
+            EXPECT_FALSE(isFull(120)) << "120.5 is rounded to the even number";
+        }
     }
-    ASSERT_TRUE(isFull(240) && machine.hasDialog());
+    EXPECT_TRUE(isFull(240));
+    ASSERT_TRUE(machine.hasDialog());
     EXPECT_TRUE(machine.seenBoard().starts_with("121212121212/")) << "the last row has entered";
     expectGolden(machine.user.top().picture, "level_completed.png");
     machine.user.wait(1h);
     machine.closeDialog();
     EXPECT_EQ(std::ranges::count(machine.seenBoard(), '/'), 4) << "5 rows on level 2";
     machine.user.wait(166ms);
-    EXPECT_TRUE(machine.game.tickCount == 0 && !isFull(0));
+    EXPECT_EQ(machine.game.tickCount, 0);
+    EXPECT_FALSE(isFull(0));
     machine.user.wait(1ms);
     EXPECT_EQ(machine.game.tickCount, 1);
     expectGolden(machine.picture(), "timed_game.png");
@@ -231,7 +254,23 @@ TEST(TimedGame, GoesOnAfterAMoveAndAPauseWhereItStopped) {
     machine.user.wait(10s);
     machine.clickStrip();
     machine.user.wait(250ms);
-    EXPECT_TRUE(machine.game.tickCount == 4 && machine.game.rowsEntered == 0) << "the click only resumed";
+    EXPECT_EQ(machine.game.tickCount, 4);
+    EXPECT_EQ(machine.game.rowsEntered, 0) << "the click only resumed";
+}
+
+TEST(TimedGame, BeginsItsFirstRowAnewAfterAGameThatEndedInMidRow) {
+    Machine machine;
+    machine.clickMenu(2);
+    machine.user.wait(7 * 250ms);
+    machine.clickPanel(10);
+    machine.closeDialog();
+    machine.clickMenu(2);
+    EXPECT_EQ(machine.game.tickCount, 0);
+    EXPECT_EQ(seenStrip(machine), "+-----------");
+    machine.user.wait(12 * 250ms - 1ms);
+    EXPECT_EQ(machine.game.rowsEntered, 0);
+    machine.user.wait(1ms);
+    EXPECT_EQ(machine.game.rowsEntered, 1);
 }
 
 TEST(StrategyGame, BombExplodesFallsClosesReleasesStonesAndBringsOneRow) {
@@ -247,7 +286,8 @@ TEST(StrategyGame, BombExplodesFallsClosesReleasesStonesAndBringsOneRow) {
         EXPECT_EQ(machine.seenBoard(), rows);
     }
     machine.user.wait(99ms);
-    EXPECT_TRUE(machine.game.rowsEntered == 0 && machine.game.stats.score == 0);
+    EXPECT_EQ(machine.game.rowsEntered, 0);
+    EXPECT_EQ(machine.game.stats.score, 0);
     machine.user.wait(1s);
     EXPECT_EQ(machine.game.rowsEntered, 1);
 }

@@ -35,9 +35,16 @@ TEST(NameEntry, TakesTheNameHoweverItIsClosedAndShowsTheTable) {
         {"Esc", [](ScriptedUser& user) { user.press(keys::escape); }},
         {"the frame", [](ScriptedUser& user) { user.clickCloseButton(); }},
         {"OK", [](ScriptedUser& user) { user.click(180, 171); }},
-        {"Tab and space", [](ScriptedUser& user) { user.press(keys::tab), user.press(keys::space); }},
+        {"Tab and space",
+         [](ScriptedUser& user) {
+             user.press(keys::tab);
+             user.press(keys::space);
+         }},
         {"Tab all the way round", [](ScriptedUser& user) {
-             user.press(keys::tab), user.press(keys::tab), user.type("!"), user.press(keys::backspace);
+             user.press(keys::tab);
+             user.press(keys::tab);
+             user.type("!");
+             user.press(keys::backspace);
              user.press(keys::enter);
          }}};
     for (const auto& [name, close] : ways) {
@@ -55,9 +62,24 @@ TEST(NameEntry, TakesTheNameHoweverItIsClosedAndShowsTheTable) {
         EXPECT_EQ(machine.caption(), "Best Scores - Quabble") << name;
         const HighScoreTable& table = machine.app.highScores.table(1);
         EXPECT_EQ(table.names[2], "Zo\xEB") << name << ": it ranks below the equal score";
-        EXPECT_TRUE(table.names[1] == "second" && table.names[3] == "third" && table.scores[2] == 6) << name;
+        EXPECT_EQ(table.names[1], "second") << name;
+        EXPECT_EQ(table.names[3], "third") << name;
+        EXPECT_EQ(table.scores[2], 6) << name;
         machine.closeDialog();
-        EXPECT_TRUE(machine.game.mainMenuActive && !machine.hasDialog()) << name;
+        EXPECT_TRUE(machine.game.mainMenuActive) << name;
+        EXPECT_FALSE(machine.hasDialog()) << name;
+    }
+}
+
+TEST(NameEntry, AsksForTheNameOfTheScoreThatTakesTheLastPlace) {
+    for (const std::int32_t eighth : {5, 6}) {
+        Machine machine;
+        machine.app.highScores.table(1).scores = {70, 60, 50, 40, 30, 20, 10, eighth};
+        machine.start(1, "....111");
+        machine.clickCell(5, 16);
+        machine.user.wait(1s);
+        machine.closeDialog();
+        EXPECT_EQ(machine.hasDialog(), eighth < 6) << "against " << eighth;
     }
 }
 
@@ -98,7 +120,8 @@ TEST(Splash, ClosesOnItsSecondTickWhateverIsClicked) {
     ScriptedUser user(frontEnd, loop);
     Task<> program = runProgram(app);
     program.start();
-    EXPECT_TRUE(user.top().traits.borderless && user.top().traits.clientSize == (Size{680, 450}));
+    EXPECT_TRUE(user.top().traits.borderless);
+    EXPECT_EQ(user.top().traits.clientSize, (Size{680, 450}));
     user.wait(1900ms);
     for (const auto& [x, y] :
          {std::pair{350.F, 420.F}, {550.F, 420.F}, {400.F, 400.F}, {400.F, 440.F}, {10.F, 10.F}})

@@ -32,7 +32,8 @@ class LongDay {
         ASSERT_EQ(caption(), "Game Statistics");
         machine_->closeDialog();
         enterScore(mode, score);
-        ASSERT_TRUE(machine_->game.mainMenuActive && !machine_->hasDialog());
+        ASSERT_TRUE(machine_->game.mainMenuActive);
+        ASSERT_FALSE(machine_->hasDialog());
         if (games_ % 50 == 0)
             startAgain();
     }

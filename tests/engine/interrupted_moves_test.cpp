@@ -86,7 +86,9 @@ TEST_F(InterruptedMoves, GiveUpWhenTheStripEndsTheLevelOrTheGame) {
         skipToLastRowOf(1);
         EXPECT_TRUE(moveWith({clickStrip}, chance).ends_with(lines("gauge=0 level=2 present present")));
         EXPECT_EQ(show(state.grid), fullRows(5, '2'));
-        EXPECT_TRUE(state.rowsEntered == 0 && state.arcadeActive && !state.boolProcessing);
+        EXPECT_EQ(state.rowsEntered, 0);
+        EXPECT_TRUE(state.arcadeActive);
+        EXPECT_FALSE(state.boolProcessing);
         play(mode, rows);
         skipToLastRowOf(10);
         EXPECT_TRUE(moveWith({clickStrip}, chance)

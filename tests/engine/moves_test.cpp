@@ -40,7 +40,8 @@ TEST_F(Moves, EveryGameStartsClean) {
             EXPECT_EQ(show(state.nextRow), fullRows(1, '2'));
             EXPECT_EQ(random.drawn, 2 * 12 * c.rows);
             const bool isTraining = c.mode == GameMode::Training;
-            EXPECT_TRUE(state.classicActive == isTraining && state.arcadeActive != isTraining);
+            EXPECT_EQ(state.classicActive, isTraining);
+            EXPECT_EQ(state.arcadeActive, !isTraining);
             EXPECT_FALSE(state.mainMenuActive);
             EXPECT_EQ(state.stats, (GameStats{.level = 1, .bestScore = c.bestScore}));
 

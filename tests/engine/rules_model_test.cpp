@@ -34,9 +34,12 @@ TEST_F(RulesModel, AgreesWithTheEngineOnScatteredBoards) {
         SCOPED_TRACE(show(grid));
         EXPECT_EQ(grid.noMovesLeft(), !model::isAnyMoveLeft(cells));
         EXPECT_EQ(grid.isTopRowOccupied(), model::isTopRowOccupied(cells));
-        for (const auto& [place, letter] : cells)
-            EXPECT_TRUE(letter != 'S' || grid.isStoneExposed(positionOf(place)) ==
-                                             model::exposedStones(cells).contains(place));
+        for (const auto& [place, letter] : cells) {
+            if (letter == 'S') {
+                EXPECT_EQ(grid.isStoneExposed(positionOf(place)),
+                          model::exposedStones(cells).contains(place));
+            }
+        }
         if (cells.empty())
             continue;
         const model::Place clicked = std::next(cells.begin(), drawBelow(cells.size(), chance))->first;

@@ -81,7 +81,9 @@ TEST_F(Painters, HaveAStandInForASheetThatCannotBeUsed) {
     for (const std::string& file : {good, aRowLess, good.substr(0, good.size() - 1), std::string()}) {
         std::ofstream(sheetFile, std::ios::binary) << file;
         const Surface loaded = loadGraphics(folder).spriteSheet;
-        ASSERT_TRUE(loaded.width() >= 400 && loaded.height() >= 838 && std::remove(sheetFile.c_str()) == 0);
+        ASSERT_GE(loaded.width(), 400);
+        ASSERT_GE(loaded.height(), 838);
+        ASSERT_EQ(std::remove(sheetFile.c_str()), 0);
         for (std::int32_t i = 0, j = 0; i < 14; i += j / 13, j = (j + 1) % 14)
             EXPECT_EQ(loaded.at(28 * i + 4, 4) == loaded.at(28 * j + 4, 4), file == good || i == j) << i;
     }
@@ -92,7 +94,9 @@ TEST(Texts, KeysAreReplacedPairByPair) {
     EXPECT_EQ(fillText("|1 |2", {"|1", "|2", "|2", 5}), "5 5");
     EXPECT_EQ(fillText("|1 |2", {"|1", -120, "|2"}), "-120 -120");
     EXPECT_EQ(fillText("a|1b ||22", {"|1", "", "|2"}), "ab ");
-    EXPECT_TRUE(loadString(38) == "Exit" && loadString(73) == "Best Val" && loadString(90) == "End game");
+    EXPECT_EQ(loadString(38), "Exit");
+    EXPECT_EQ(loadString(73), "Best Val");
+    EXPECT_EQ(loadString(90), "End game");
 }
 
 class Result : public testing::Test {
@@ -156,7 +160,8 @@ TEST_F(Result, ShowsItsLinesWholeAndHighlightsItsButtonUntilItCloses) {
         }
         loop.post({user.topWindow(), way.first, 186.5F, 204.5F, way.second});
         loop.wake();
-        EXPECT_TRUE(showing.done() && frontEnd.windows().empty()) << way.second;
+        EXPECT_TRUE(showing.done()) << way.second;
+        EXPECT_TRUE(frontEnd.windows().empty()) << way.second;
     }
 }
 

@@ -39,27 +39,63 @@ TEST(Drawing, EveryOperationIsClippedToBothPictures) {
     }
 }
 
-TEST(Drawing, ABitmapFileIsReadWholeOrNotAtAll) {
-    // 3 x 2 pixels, six bytes between the header and them; the bytes of the pixels are 1, 2, 3 and so on.
-    std::string good("BM\0\0\0\0\0\0\0\0\x3C\0\0\0\x28\0\0\0\3\0\0\0\2\0\0\0\1\0\x18", 29);
-    good.resize(60);
+// 3 x 2 pixels, six bytes between the header and them; the bytes of the pixels are 1, 2, 3 and so on.
+std::string bitmapOfSix() {
+    std::string file("BM\0\0\0\0\0\0\0\0\x3C\0\0\0\x28\0\0\0\3\0\0\0\2\0\0\0\1\0\x18", 29);
+    file.resize(60);
     for (char byte = 1; byte <= 24; ++byte)
-        good += byte;
-    const std::string fromTop = std::string(good).replace(22, 4, "\376\377\377\377");
-    const auto decode = [](const std::string& file) { return decodeBitmap(std::as_bytes(std::span(file))); };
-    ASSERT_TRUE(decode(good) && decode(fromTop) && decode(good)->bounds() == (Rect{0, 0, 3, 2}));
+        file += byte;
+    return file;
+}
+
+// The same with its rows from the top down, which a negative height says.
+std::string bitmapOfSixFromTheTop() {
+    return bitmapOfSix().replace(22, 4, "\376\377\377\377");
+}
+
+std::optional<Surface> decode(const std::string& file) {
+    return decodeBitmap(std::as_bytes(std::span(file)));
+}
+
+TEST(Drawing, ABitmapFileIsReadWholeOrNotAtAll) {
+    const std::string good = bitmapOfSix();
+    const std::string fromTop = bitmapOfSixFromTheTop();
+    ASSERT_TRUE(decode(good));
+    ASSERT_TRUE(decode(fromTop));
+    ASSERT_EQ(decode(good)->bounds(), (Rect{0, 0, 3, 2}));
     EXPECT_EQ(decode(good)->at(2, 0), (Colour{21, 20, 19}));
     EXPECT_EQ(decode(fromTop)->at(2, 1), (Colour{21, 20, 19}));
     for (std::size_t size = 0; size < good.size(); ++size)
         EXPECT_FALSE(decode(good.substr(0, size))) << size;
-    for (std::size_t i = 0; i < 54 * 256; ++i) {
-        const std::size_t at = i / 256;
-        for (std::string file : {good, fromTop}) {
-            file[at] = static_cast<char>(i);
-            const auto picture = decode(file);
-            const bool spoilt = file[at] != good[at] && (at < 2 || (at >= 28 && at < 34));
-            const int end = picture ? file[10] + (picture->width() * 3 + 3) / 4 * 4 * picture->height() : 0;
-            EXPECT_FALSE(picture && (spoilt || picture->isEmpty() || file[10] < 54 || end > 84)) << at;
+}
+
+// Whatever a byte of the header says: where a picture comes of it, its pixels lie behind the header and
+// within the file, and it has the type and the depth that are read.
+TEST(Drawing, NoByteOfABitmapsHeaderLeadsOutOfTheFile) {
+    constexpr std::size_t headerSize = 54;
+    const auto isFixed = [](std::size_t at) {
+        const bool isType = at < 2;
+        const bool isDepthOrCompression = at >= 28 && at < 34;
+        return isType || isDepthOrCompression;
+    };
+    for (const std::string& good : {bitmapOfSix(), bitmapOfSixFromTheTop()}) {
+        for (std::size_t at = 0; at < headerSize; ++at) {
+            for (int byte = 0; byte < 256; ++byte) {
+                SCOPED_TRACE(testing::Message() << "byte " << at << " is " << byte);
+                std::string file = good;
+                file[at] = static_cast<char>(byte);
+                const auto picture = decode(file);
+                if (!picture)
+                    continue;
+                const int start = static_cast<unsigned char>(file[10]);
+                const int lineSize = (picture->width() * 3 + 3) / 4 * 4;
+                EXPECT_FALSE(picture->isEmpty());
+                EXPECT_GE(start, static_cast<int>(headerSize));
+                EXPECT_LE(start + lineSize * picture->height(), static_cast<int>(file.size()));
+                if (isFixed(at)) {
+                    EXPECT_EQ(file[at], good[at]);
+                }
+            }
         }
     }
 }
