@@ -52,8 +52,8 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
     }
 }
 
-// SDL hides a window first and waits until the server says so. What the server refuses then must be heard before
-// SDL quits, for errors end the process after that.
+// SDL hides a window first and waits until the server says so. What the server refuses then must be heard
+// before SDL quits, for errors end the process after that.
 DesktopWindow::~DesktopWindow() {
     if (!isLost_)
         return;
