@@ -43,7 +43,7 @@ class FrontEnd {
 
     virtual TimePoint now() = 0;
 
-    // Makes a window and shows it; it is black until its first pixels come.
+    // Makes a window. It comes to be seen with its first pixels.
     virtual void createWindow(WindowId window, const NativeWindow& traits) = 0;
     // Shows the picture, of the window's client size. When the window is uncovered or restored the front end
     // shows it again by itself: it must stay where it is until the next one or until the window is closed.

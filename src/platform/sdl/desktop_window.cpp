@@ -55,9 +55,9 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
 // SDL hides a window first and waits until the server says so. What the server refuses then must be heard
 // before SDL quits, for errors end the process after that.
 DesktopWindow::~DesktopWindow() {
-    if (!isLost_)
-        return;
     const auto x11 = X11Window::of(sdl());
+    if (!isLost_ || !x11)
+        return;
     x11->reportHidden();
     window_.reset();
     x11->waitForServer();
@@ -120,8 +120,8 @@ void DesktopWindow::show(const Surface& picture) {
 void DesktopWindow::showAgain() {
     if (picture_ == nullptr || (shared_ && shared_->size() == size()))
         return;
-    if (shared_)
-        shared_ = SharedPicture::of(*X11Window::of(sdl()), size());
+    if (const auto x11 = X11Window::of(sdl()); x11 && shared_)
+        shared_ = SharedPicture::of(*x11, size());
     else if (SDL_UpdateWindowSurface(sdl()) == 0)
         return;
     show(*picture_);
@@ -152,7 +152,7 @@ void DesktopWindow::fill(SDL_Surface& screen, const Surface& picture) {
 }
 
 // On Wayland one can only ask for it.
-void DesktopWindow::takeKeyboard() {
+void DesktopWindow::takeKeyboard() const {
     if (SDL_SetWindowInputFocus(sdl()) != 0)
         SDL_RaiseWindow(sdl());
 }

@@ -32,7 +32,7 @@ class DesktopWindow {
     // A window that was uncovered, restored or resized gets its picture again.
     void showAgain();
 
-    void takeKeyboard();
+    void takeKeyboard() const;
     // Another program has destroyed it.
     void setLost() { isLost_ = true; }
 

@@ -135,7 +135,7 @@ void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
 // While a dialog is open the keyboard is the innermost one's, whichever of the program's windows the desktop
 // has given it to.
 void SdlFrontEnd::handOnKeyboard(const MessageLoop& loop) {
-    DesktopWindow* dialog = loop.modalWindow() == nullptr ? nullptr : find(loop.modalWindow()->id());
+    const DesktopWindow* dialog = loop.modalWindow() == nullptr ? nullptr : find(loop.modalWindow()->id());
     const SDL_Window* focused = SDL_GetKeyboardFocus();
     if (dialog != nullptr && focused != nullptr && focused != dialog->sdl())
         dialog->takeKeyboard();
