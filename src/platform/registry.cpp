@@ -6,7 +6,9 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <array>
 #include <atomic>
+#include <cerrno>
 #include <cstdlib>
 #include <filesystem>
 
@@ -17,6 +19,26 @@ namespace {
 
 constexpr mode_t userOnlyFolder = 0700;
 constexpr mode_t userOnlyFile = 0600;
+
+// More than a registry of ours ever takes, and little enough to be read through at every start.
+constexpr off_t largestFile = off_t{8} << 20;
+// Room for the endings that SQLite adds to the names it can take.
+constexpr std::size_t longestPath = 500;
+
+// True when nothing lies at the path, or a file that can be opened without waiting for anybody.
+bool isFileOrNothing(const std::string& path) {
+    struct stat status{};
+    if (::stat(path.c_str(), &status) != 0)
+        return errno == ENOENT;
+    return S_ISREG(status.st_mode) && status.st_size <= largestFile;
+}
+
+// The database and the files that SQLite looks for beside it.
+bool areFilesOrNothing(const std::string& database) {
+    return database.size() <= longestPath &&
+           std::ranges::all_of(std::array{"", "-journal", "-wal", "-shm"},
+                               [&](const char* ending) { return isFileOrNothing(database + ending); });
+}
 
 // Makes the folders above a file and the file itself, empty; what exists already stays as it is. That it
 // failed shows when the file is opened.
@@ -51,32 +73,41 @@ Registry::~Registry() = default;
 Registry::Registry(Registry&& other) noexcept = default;
 Registry& Registry::operator=(Registry&& other) noexcept = default;
 
-std::optional<RegistryKey> Registry::openKey(std::string_view name) {
-    if (!keeper_) {
-        prepareFile(path_);
-        // A change needs a journal beside the file.
-        isGivenUp_ |= ::access(std::filesystem::path(path_).parent_path().c_str(), W_OK) != 0;
-    }
-    if (isGivenUp_)
-        return std::nullopt;
-    std::shared_ptr<RegistryDatabase> database = RegistryDatabase::open(path_);
-    isGivenUp_ = !database;
-    if (isGivenUp_)
-        return std::nullopt;
-    return RegistryKey(std::move(database), std::string(name));
+// Whether there is a file of its own that can be read and written, or can be made.
+bool Registry::hasUsableFile() const {
+    if (!areFilesOrNothing(path_))
+        return false;
+    prepareFile(path_);
+    // A change needs files beside it.
+    return ::access(std::filesystem::path(path_).parent_path().c_str(), W_OK) == 0;
 }
 
-std::optional<RegistryKey> RegistryKey::createKey(std::string_view subkey, std::string_view classString) {
-    std::string path = path_ + "\\" + std::string(subkey);
+std::optional<RegistryKey> Registry::openKey(std::string_view name, Access access) {
+    if (isGivenUp_)
+        return std::nullopt;
+    std::shared_ptr<RegistryDatabase> database;
+    if (keeper_ || hasUsableFile())
+        database = RegistryDatabase::open(path_, access);
+    isGivenUp_ = !database;
+    if (!database)
+        return std::nullopt;
+    return RegistryKey(std::move(database), std::string(name), "");
+}
+
+RegistryKey RegistryKey::createKey(std::string_view subkey, std::string_view classString) const {
+    return RegistryKey(database_, path_ + "\\" + std::string(subkey), std::string(classString));
+}
+
+bool RegistryKey::createWithParents() {
     for (std::size_t end = 0; end != std::string::npos;) {
-        end = path.find('\\', end + 1);
-        const std::string part = path.substr(0, end);
+        end = path_.find('\\', end + 1);
+        const std::string part = path_.substr(0, end);
         auto insertion = database_->prepare("INSERT OR IGNORE INTO keys (path, class) VALUES (?1, ?2)");
-        insertion.bind(1, part).bind(2, end == std::string::npos ? classString : std::string_view(""));
+        insertion.bind(1, part).bind(2, end == std::string::npos ? std::string_view(class_) : "");
         if (!database_->change(insertion))
-            return std::nullopt;
+            return false;
     }
-    return RegistryKey(database_, std::move(path));
+    return true;
 }
 
 std::optional<RegistryKey::Found> RegistryKey::query(std::string_view name,
@@ -93,12 +124,18 @@ std::optional<RegistryKey::Found> RegistryKey::query(std::string_view name,
 }
 
 bool RegistryKey::set(std::string_view name, ValueType type, std::span<const std::byte> data) {
+    if (!createWithParents())
+        return false;
     auto entry = database_->prepare(
         "INSERT INTO entries (key, name, type, data) VALUES (?1, ?2, ?3, ?4) "
         "ON CONFLICT (key, name) DO UPDATE SET type = ?3, data = ?4");
     entry.bind(1, path_).bind(2, name).bind(3, static_cast<std::int64_t>(type));
     entry.bindBytes(4, data.data(), data.size());
     return database_->change(entry);
+}
+
+bool RegistryKey::commit() {
+    return database_->commit();
 }
 
 std::string userRegistryPath(std::string_view programName) {

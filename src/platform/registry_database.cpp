@@ -3,23 +3,29 @@
 namespace quabble {
 namespace {
 
-constexpr int busyTimeout = 10'000;  // milliseconds
+// Another program's lock is waited for: long enough for one that saves, and short enough to end in time when
+// the process is asked to.
+constexpr int busyTimeout = 1000;  // milliseconds
 constexpr std::int64_t schemaVersion = 1;
+constexpr int longestValue = 1 << 20;  // bytes
 
-constexpr const char* schema = R"(
-    CREATE TABLE keys (
+constexpr std::string_view keysTable = R"(CREATE TABLE keys (
         path  TEXT NOT NULL PRIMARY KEY COLLATE NOCASE,
         class TEXT NOT NULL
-    );
-    CREATE TABLE entries (
+    ))";
+constexpr std::string_view entriesTable = R"(CREATE TABLE entries (
         key  TEXT NOT NULL COLLATE NOCASE REFERENCES keys (path),
         name TEXT NOT NULL COLLATE NOCASE,
         type INTEGER NOT NULL,
         data BLOB NOT NULL,
         PRIMARY KEY (key, name)
-    );
-    PRAGMA user_version = 1;
-)";
+    ))";
+
+std::string withoutSpace(std::string_view text) {
+    std::string dense(text);
+    std::erase_if(dense, [](char character) { return character == ' ' || character == '\n'; });
+    return dense;
+}
 
 }  // namespace
 
@@ -58,47 +64,77 @@ std::unique_ptr<RegistryDatabase> RegistryDatabase::connect(const std::string& p
     const int flags = SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE | SQLITE_OPEN_URI;
     const int result = sqlite3_open_v2(path.c_str(), &connection, flags, nullptr);
     std::unique_ptr<RegistryDatabase> database(new RegistryDatabase(connection));
-    if (result != SQLITE_OK)
+    if (result != SQLITE_OK || !database->trustNothing())
         return nullptr;
     sqlite3_busy_timeout(connection, busyTimeout);
     return database;
 }
 
-std::unique_ptr<RegistryDatabase> RegistryDatabase::open(const std::string& path) {
+// Nothing that somebody has written into the file is ever carried out.
+bool RegistryDatabase::trustNothing() {
+    sqlite3* connection = connection_.get();
+    sqlite3_limit(connection, SQLITE_LIMIT_LENGTH, longestValue);
+    return sqlite3_db_config(connection, SQLITE_DBCONFIG_DEFENSIVE, 1, nullptr) == SQLITE_OK &&
+           sqlite3_db_config(connection, SQLITE_DBCONFIG_TRUSTED_SCHEMA, 0, nullptr) == SQLITE_OK &&
+           sqlite3_db_config(connection, SQLITE_DBCONFIG_ENABLE_TRIGGER, 0, nullptr) == SQLITE_OK &&
+           sqlite3_db_config(connection, SQLITE_DBCONFIG_ENABLE_VIEW, 0, nullptr) == SQLITE_OK;
+}
+
+std::unique_ptr<RegistryDatabase> RegistryDatabase::open(const std::string& path, Access access) {
     auto database = connect(path);
     const bool isWritable = database && sqlite3_db_readonly(database->connection_.get(), "main") == 0;
-    if (!isWritable || !database->begin() || !database->isOrBecomesRegistry())
+    if (!isWritable || !database->beginReading())
         return nullptr;
-    database->inTransaction_ = true;
+    if (access == Access::Write && !database->beginWriting())
+        return nullptr;
     return database;
 }
 
-// What is not committed, or cannot be, is rolled back when the connection closes.
-RegistryDatabase::~RegistryDatabase() {
-    if (inTransaction_)
-        execute("COMMIT");
+bool RegistryDatabase::beginReading() {
+    return execute("BEGIN") && content() != Content::SomethingElse;
 }
 
-bool RegistryDatabase::begin() {
-    return execute("PRAGMA synchronous = EXTRA") && execute("BEGIN IMMEDIATE");
+// With a write-ahead log those who read keep nobody from writing. A file that others are reading cannot be
+// switched over to it; then the lock that it needs without the log is not to be had either. The file is
+// looked at again, for it may have become another meanwhile.
+bool RegistryDatabase::beginWriting() {
+    if (!execute("ROLLBACK") || !execute("PRAGMA synchronous = EXTRA"))
+        return false;
+    sqlite3_busy_timeout(connection_.get(), 0);
+    execute("PRAGMA journal_mode = WAL");
+    sqlite3_busy_timeout(connection_.get(), busyTimeout);
+    if (!execute("BEGIN EXCLUSIVE"))
+        return false;
+    if (const Content found = content(); found != Content::Nothing)
+        return found == Content::Registry;
+    return execute(std::string(keysTable).c_str()) && execute(std::string(entriesTable).c_str()) &&
+           execute("PRAGMA user_version = 1");
 }
 
 bool RegistryDatabase::change(RegistryStatement& statement) {
-    inTransaction_ = inTransaction_ && statement.run();
-    return inTransaction_;
+    isKept_ = isKept_ && statement.run();
+    return isKept_;
 }
 
-bool RegistryDatabase::isOrBecomesRegistry() {
+bool RegistryDatabase::commit() {
+    return isKept_ && execute("COMMIT");
+}
+
+RegistryDatabase::Content RegistryDatabase::content() {
     RegistryStatement check = prepare("PRAGMA integrity_check(1)");
     RegistryStatement version = prepare("PRAGMA user_version");
-    RegistryStatement tables =
-        prepare("SELECT count(*), total(name IN ('keys', 'entries')) FROM sqlite_schema");
-    const bool isSound = check.nextRow() && check.bytes(0) == "ok" && version.nextRow() && tables.nextRow();
+    const bool isSound = check.nextRow() && check.bytes(0) == "ok" && version.nextRow();
     if (!isSound)
-        return false;
-    if (version.number(0) == 0 && tables.number(0) == 0)
-        return execute(schema);
-    return version.number(0) == schemaVersion && tables.number(1) == 2;
+        return Content::SomethingElse;
+    std::string found;
+    RegistryStatement schema =
+        prepare("SELECT sql FROM sqlite_schema WHERE sql IS NOT NULL ORDER BY name DESC");
+    while (schema.nextRow())
+        found += withoutSpace(schema.bytes(0));
+    if (version.number(0) == 0 && found.empty())
+        return Content::Nothing;
+    const bool isOurs = found == withoutSpace(keysTable) + withoutSpace(entriesTable);
+    return isOurs && version.number(0) == schemaVersion ? Content::Registry : Content::SomethingElse;
 }
 
 bool RegistryDatabase::execute(const char* sql) {

@@ -74,29 +74,22 @@ void loadTable(const RegistryKey& key, std::int16_t number, HighScoreTable& tabl
     }
 }
 
-bool saveTable(RegistryKey& key, std::int16_t number, const HighScoreTable& table) {
-    bool written = key.set(scoresName(number), ValueType::Binary, bytesOf(table.scores));
+void saveTable(RegistryKey& key, std::int16_t number, const HighScoreTable& table) {
+    key.set(scoresName(number), ValueType::Binary, bytesOf(table.scores));
     for (std::size_t place = 0; place < table.names.size(); ++place) {
         const std::string& name = table.names[place];
         const auto withZero = std::as_bytes(std::span(name.c_str(), name.size() + 1));
-        written = key.set(playerName(number, place), ValueType::String, withZero) && written;
+        key.set(playerName(number, place), ValueType::String, withZero);
     }
-    return written;
 }
 
-// The root key stays open as long as the program's own: it holds the transaction.
-struct OpenStore {
-    RegistryKey software;
-    std::optional<RegistryKey> own;
-};
-
-std::optional<OpenStore> openStore(Registry& registry) {
-    auto software = registry.openKey("Software");
+// The program's own key.
+std::optional<RegistryKey> openStore(Registry& registry, Access access) {
+    const auto software = registry.openKey("Software", access);
     if (!software)
         return std::nullopt;
     const std::string subkey = "Vorlane\\" + std::string(applicationTitle) + "\\" + versionText();
-    auto own = software->createKey(subkey, "USERDATA");
-    return OpenStore{std::move(*software), std::move(own)};
+    return software->createKey(subkey, "USERDATA");
 }
 
 }  // namespace
@@ -112,34 +105,28 @@ void SolvingData::setSplashSeen() {
 }
 
 StoreResult loadSettings(Settings& settings, HighScores& highScores, Registry& registry) {
-    const auto store = openStore(registry);
-    if (!store)
+    const auto key = openStore(registry, Access::Read);
+    if (!key)
         return StoreResult::NotOpened;
-    if (!store->own)
-        return StoreResult::NotWritten;
-    const RegistryKey& key = *store->own;
-    key.query("SOLVINGDATA", settings.solvingData.bytes);
-    key.query("NUMWFSF", settings.numwfsf);
-    if (!queryNumbers(key, "SOUNDOPTIONS", settings.soundOptions))
+    key->query("SOLVINGDATA", settings.solvingData.bytes);
+    key->query("NUMWFSF", settings.numwfsf);
+    if (!queryNumbers(*key, "SOUNDOPTIONS", settings.soundOptions))
         settings.soundOptions.fill(1);
     for (std::int16_t table = 1; table <= highScoreTables; ++table)
-        loadTable(key, table, highScores.table(table));
+        loadTable(*key, table, highScores.table(table));
     return StoreResult::Done;
 }
 
 StoreResult saveSettings(const Settings& settings, const HighScores& highScores, Registry& registry) {
-    auto store = openStore(registry);
-    if (!store)
+    auto key = openStore(registry, Access::Write);
+    if (!key)
         return StoreResult::NotOpened;
-    if (!store->own)
-        return StoreResult::NotWritten;
-    RegistryKey& key = *store->own;
-    bool written = key.set("SOLVINGDATA", ValueType::Binary, settings.solvingData.bytes);
-    written = key.set("NUMWFSF", ValueType::Binary, settings.numwfsf) && written;
-    written = key.set("SOUNDOPTIONS", ValueType::Binary, bytesOf(settings.soundOptions)) && written;
+    key->set("SOLVINGDATA", ValueType::Binary, settings.solvingData.bytes);
+    key->set("NUMWFSF", ValueType::Binary, settings.numwfsf);
+    key->set("SOUNDOPTIONS", ValueType::Binary, bytesOf(settings.soundOptions));
     for (std::int16_t table = 1; table <= highScoreTables; ++table)
-        written = saveTable(key, table, highScores.table(table)) && written;
-    return written ? StoreResult::Done : StoreResult::NotWritten;
+        saveTable(*key, table, highScores.table(table));
+    return key->commit() ? StoreResult::Done : StoreResult::NotWritten;
 }
 
 }  // namespace quabble

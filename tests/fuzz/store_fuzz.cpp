@@ -42,7 +42,8 @@ void tryAsFile(std::span<const unsigned char> bytes) {
     Registry registry(path);
     requireRoundTrip(registry);
     std::remove(path.c_str());
-    std::remove((path + "-journal").c_str());
+    for (const char* ending : {"-journal", "-wal", "-shm"})
+        std::remove((path + ending).c_str());
 }
 
 // Values one after another: a byte that chooses the name, a byte for the size, then the bytes themselves.
@@ -51,14 +52,15 @@ void tryAsValues(std::span<const unsigned char> bytes) {
                                         "2STATS",      "1STATS1", "3STATS8"};
     Registry registry = Registry::inMemory();
     {
-        auto software = registry.openKey("Software");
-        auto key = software->createKey("Vorlane\\Quabble\\1.0", "USERDATA");
+        auto key =
+            registry.openKey("Software", Access::Write)->createKey("Vorlane\\Quabble\\1.0", "USERDATA");
         while (bytes.size() >= 2) {
             const std::string& name = names[bytes[0] % std::size(names)];
             const auto value = bytes.subspan(2, std::min<std::size_t>(bytes[1], bytes.size() - 2));
-            key->set(name, ValueType::Binary, std::as_bytes(value));
+            key.set(name, ValueType::Binary, std::as_bytes(value));
             bytes = bytes.subspan(2 + value.size());
         }
+        key.commit();
     }
     requireRoundTrip(registry);
 }

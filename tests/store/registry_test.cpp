@@ -22,38 +22,39 @@ TEST_F(RegistryTest, KeepsValuesUnderNamesWithoutRegardToCase) {
     for (Registry* kept : {&registry, &inMemory}) {
         std::array<std::byte, 5> buffer{};
         {
-            auto root = kept->openKey("R");
-            auto key = root->createKey("A\\b", "CLASS");
-            EXPECT_FALSE(key->query("name", buffer)) << "there is none yet";
-            EXPECT_TRUE(key->set("name", ValueType::Binary, bytes("first")));
-            EXPECT_TRUE(key->set("NAME", ValueType::String, bytes("12345")));
-            EXPECT_TRUE(key->set("Long", ValueType::Binary, bytes("123456")));
-            EXPECT_TRUE(key->set("Empty", ValueType::String, {}));
+            RegistryKey key = kept->openKey("R", Access::Write)->createKey("A\\b", "CLASS");
+            EXPECT_FALSE(key.query("name", buffer)) << "there is none yet";
+            EXPECT_TRUE(key.set("name", ValueType::Binary, bytes("first")));
+            EXPECT_TRUE(key.set("NAME", ValueType::String, bytes("12345")));
+            EXPECT_TRUE(key.set("Long", ValueType::Binary, bytes("123456")));
+            EXPECT_TRUE(key.set("Empty", ValueType::String, {}));
+            EXPECT_TRUE(key.commit());
         }
-        auto root = kept->openKey("r");
-        auto key = root->createKey("a\\B", "OTHER");
-        const auto found = key->query("Name", buffer);
+        const RegistryKey key = kept->openKey("r", Access::Read)->createKey("a\\B", "OTHER");
+        const auto found = key.query("Name", buffer);
         ASSERT_TRUE(found);
-        EXPECT_TRUE(found->type == ValueType::String && found->size == 5);
+        EXPECT_EQ(found->type, ValueType::String);
+        EXPECT_EQ(found->size, 5U);
         EXPECT_EQ(std::memcmp(buffer.data(), "12345", 5), 0);
-        EXPECT_FALSE(key->query("long", buffer));
+        EXPECT_FALSE(key.query("long", buffer));
         EXPECT_EQ(std::memcmp(buffer.data(), "12345", 5), 0) << "what does not fit leaves the buffer alone";
-        EXPECT_EQ(key->query("empty", buffer)->size, 0U);
+        EXPECT_EQ(key.query("empty", buffer)->size, 0U);
     }
     EXPECT_EQ(sql("SELECT group_concat(path || class, ' ') FROM keys"), "R R\\A R\\A\\bCLASS\n");
 }
 
 TEST_F(RegistryTest, IsTheUsersAloneAndOneTransaction) {
     const mode_t before = umask(0);
-    auto root = registry.openKey("Software");
-    umask(before);
-    auto key = root->createKey("A", "");
-    key->set("x", ValueType::Binary, bytes("1"));
-    EXPECT_EQ(sql("SELECT count(*) FROM sqlite_schema"), "0\n")
-        << "nothing is seen before the root key closes";
-    key.reset();
-    root.reset();
+    {
+        RegistryKey key = registry.openKey("Software", Access::Write)->createKey("A", "");
+        umask(before);
+        key.set("x", ValueType::Binary, bytes("1"));
+        EXPECT_EQ(sql("SELECT count(*) FROM sqlite_schema"), "0\n") << "nothing is seen before the commit";
+        key.commit();
+    }
     EXPECT_EQ(stored("x"), "31\n");
+    registry.openKey("Software", Access::Write)->createKey("A", "").set("x", ValueType::Binary, bytes("2"));
+    EXPECT_EQ(stored("x"), "31\n") << "what is not committed is not kept";
     struct stat status{};
     stat(file.c_str(), &status);
     EXPECT_EQ(status.st_mode & 0777U, 0600U);
@@ -83,6 +84,78 @@ TEST_F(RegistryTest, LiesInTheUsersDataFolder) {
     const auto isAtTheTop = [] { return userRegistryPath("q") == "//.local/share/q/registry.db"; };
     EXPECT_TRUE(getuid() != 0 || inChild([&] { return setuid(4'000'000) == 0 && isAtTheTop(); }) == 1)
         << "a user without a name";
+}
+
+// Somebody else's connection, which begins what it is told to and does not end it.
+struct OtherProgram {
+    OtherProgram(const std::filesystem::path& file, const char* begin) {
+        sqlite3_open(file.c_str(), &connection);
+        EXPECT_EQ(sqlite3_exec(connection, begin, nullptr, nullptr, nullptr), SQLITE_OK);
+    }
+    ~OtherProgram() { sqlite3_close(connection); }
+    OtherProgram(const OtherProgram&) = delete;
+    OtherProgram& operator=(const OtherProgram&) = delete;
+
+    sqlite3* connection = nullptr;
+};
+
+TEST_F(RegistryTest, IsReadWhileOthersWriteAndWrittenWhileOthersRead) {
+    Kept first;
+    first.table(1).names[0] = "first";
+    first.save(registry);
+    {
+        const OtherProgram reader(file, "BEGIN; SELECT * FROM entries");
+        Kept second;
+        second.table(1).names[0] = "second";
+        EXPECT_EQ(second.save(registry), StoreResult::Done);
+    }
+    {
+        const OtherProgram writer(file, "BEGIN IMMEDIATE; DELETE FROM entries");
+        Kept loaded;
+        EXPECT_EQ(loaded.load(registry), StoreResult::Done);
+        EXPECT_EQ(loaded.table(1).names[0], "second");
+        EXPECT_EQ(loaded.save(registry), StoreResult::NotOpened) << "only one can write";
+    }
+    Kept kept;
+    Registry fresh(file.string());
+    EXPECT_EQ(kept.load(fresh), StoreResult::Done);
+    EXPECT_EQ(kept.table(1).names[0], "second");
+}
+
+// What lies in a file is never carried out, and what is no file is never waited for.
+TEST_F(RegistryTest, RefusesWhatWouldHoldItUp) {
+    Kept().save(registry);
+    sql("CREATE TRIGGER endless AFTER INSERT ON entries BEGIN "
+        "INSERT OR REPLACE INTO keys WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n) "
+        "SELECT i, '' FROM n; END");
+    Registry withTrigger(file.string());
+    EXPECT_EQ(Kept().load(withTrigger), StoreResult::NotOpened);
+
+    for (const char* ending : {"", "-journal", "-wal", "-shm"}) {
+        std::filesystem::remove_all(file.parent_path());
+        std::filesystem::create_directories(file.parent_path());
+        ASSERT_EQ(mkfifo((file.string() + ending).c_str(), 0600), 0);
+        Registry withPipe(file.string());
+        EXPECT_EQ(Kept().load(withPipe), StoreResult::NotOpened) << ending;
+        Registry again(file.string());
+        EXPECT_EQ(Kept().save(again), StoreResult::NotOpened) << ending;
+    }
+    Registry device("/dev/zero");
+    EXPECT_EQ(Kept().save(device), StoreResult::NotOpened);
+}
+
+TEST_F(RegistryTest, SaysThatAPathIsTooLongForIt) {
+    for (const std::size_t length : {400U, 480U, 500U, 520U, 1000U}) {
+        std::string path = folder.string();
+        while (path.size() < length)
+            path += "/" + std::string(std::min<std::size_t>(100, length - path.size()), 'x');
+        Registry deep(path + "/registry.db");
+        const StoreResult saved = Kept().save(deep);
+        Registry again(path + "/registry.db");
+        EXPECT_EQ(Kept().load(again), saved) << length;
+        EXPECT_TRUE(saved == StoreResult::Done || saved == StoreResult::NotOpened) << length;
+        EXPECT_EQ(saved == StoreResult::Done, length < 490) << length;
+    }
 }
 
 // Whatever lies where the registry should be is the user's: it is left as it is, and the game plays on.
