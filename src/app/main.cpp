@@ -1,4 +1,5 @@
 #include <chrono>
+#include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <string>
@@ -7,6 +8,7 @@
 #include "platform/sdl/sdl_front_end.hpp"
 
 int main() {
+    std::signal(SIGXFSZ, SIG_IGN);  // a file that may not grow is a write that fails
     std::string problem;
     const auto frontEnd = quabble::SdlFrontEnd::open(problem);
     if (!frontEnd) {

@@ -1,6 +1,7 @@
 #include "platform/bitmap_file.hpp"
 
 #include <cstdint>
+#include <filesystem>
 #include <fstream>
 #include <iterator>
 #include <vector>
@@ -76,6 +77,9 @@ std::optional<Surface> decodeBitmap(std::span<const std::byte> file) {
 }
 
 std::optional<Surface> loadBitmap(const std::string& path) {
+    std::error_code unknown;
+    if (!std::filesystem::is_regular_file(path, unknown))
+        return std::nullopt;
     std::ifstream stream(path, std::ios::binary | std::ios::ate);
     const std::streamoff size = stream ? static_cast<std::streamoff>(stream.tellg()) : -1;
     if (size < 0 || static_cast<std::uintmax_t>(size) > largestFile)

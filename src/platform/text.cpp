@@ -32,10 +32,14 @@ void paintLine(Surface& surface, const Rect& clip, std::string_view text, double
                Colour colour, const Font& font) {
     ScaledFont& scaled = scaledFont(font.face, font.points);
     const std::int32_t baseline = top + scaled.ascent();
+    // No glyph reaches further from its pen than this; of a long line most lie far outside.
+    const std::int32_t reach = 2 * scaled.lineHeight();
     double pen = left;
     for (const char character : text) {
-        paintGlyph(surface, clip, scaled.glyph(character, pen), {ScaledFont::wholePixel(pen), baseline},
-                   colour);
+        if (pen > clip.left - reach && pen < clip.right + reach) {
+            paintGlyph(surface, clip, scaled.glyph(character, pen), {ScaledFont::wholePixel(pen), baseline},
+                       colour);
+        }
         pen += scaled.advance(character);
     }
     if (font.underlined) {
@@ -86,6 +90,10 @@ void drawText(Surface& surface, const Rect& area, std::string_view text, std::in
         paintLine(surface, clip, line, left, top, colour, font);
         top += scaled.lineHeight();
     }
+}
+
+double advanceOf(char character, const Font& font) {
+    return scaledFont(font.face, font.points).advance(character);
 }
 
 Size measureText(std::string_view text, const Font& font) {

@@ -33,6 +33,9 @@ constexpr std::int32_t singleLine = 32;
 void drawText(Surface& surface, const Rect& area, std::string_view text, std::int32_t format, Colour colour,
               const Font& font);
 
+// How far a character moves the pen, in pixels.
+double advanceOf(char character, const Font& font);
+
 // The width and the height of one line of text, in pixels.
 Size measureText(std::string_view text, const Font& font);
 

@@ -1,6 +1,7 @@
 #include "platform/text_box.hpp"
 
 #include <algorithm>
+#include <cmath>
 #include <ranges>
 
 #include "platform/windows_1252.hpp"
@@ -14,7 +15,7 @@ constexpr Colour selected{62, 105, 214};
 }  // namespace
 
 void TextBox::clear() {
-    text_.clear();
+    replace(0, text_.size(), {});
     moveCaret(0, false);
 }
 
@@ -111,7 +112,7 @@ void TextBox::edit(EditCommand command, bool extends) {
 }
 
 std::int32_t TextBox::widthUpTo(std::size_t characters) const {
-    return measureText(std::string_view(text_).substr(0, characters), font).width;
+    return static_cast<std::int32_t>(std::floor(pens_[characters] + 0.5));
 }
 
 // The gap between characters nearest to a point.
@@ -149,8 +150,17 @@ std::string TextBox::selection() const {
 void TextBox::replaceSelection(std::string_view with) {
     const auto [first, last] = std::minmax(caret_, anchor_);
     with = with.substr(0, maxLength - (text_.size() - (last - first)));
-    text_.replace(first, last - first, with);
+    replace(first, last, with);
     moveCaret(first + with.size(), false);
+}
+
+// Where the characters before the change lie stays known, so that typing at the end costs the same however
+// long the text is.
+void TextBox::replace(std::size_t first, std::size_t last, std::string_view with) {
+    text_.replace(first, last - first, with);
+    pens_.resize(first + 1);
+    for (const char character : std::string_view(text_).substr(first))
+        pens_.push_back(pens_.back() + advanceOf(character, font));
 }
 
 void TextBox::moveCaret(std::size_t to, bool extends) {

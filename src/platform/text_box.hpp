@@ -2,6 +2,7 @@
 
 #include <functional>
 #include <string>
+#include <vector>
 
 #include "platform/control.hpp"
 #include "platform/front_end.hpp"
@@ -16,7 +17,7 @@ class TextBox final : public Control {
     // The front end, which must outlive the box, has the clipboard.
     explicit TextBox(FrontEnd& frontEnd) : frontEnd_(frontEnd) {}
 
-    Font font;
+    Font font;  // set before there is a text
 
     // The most characters that the box holds; what is typed or pasted beyond them is left out.
     static constexpr std::size_t maxLength = 32767;
@@ -44,12 +45,14 @@ class TextBox final : public Control {
     std::size_t wordRight() const;
     std::string selection() const;
     void replaceSelection(std::string_view with);
+    void replace(std::size_t first, std::size_t last, std::string_view with);
     void moveCaret(std::size_t to, bool extends);
     void copySelection();
     void scrollToCaret();
 
     FrontEnd& frontEnd_;
     std::string text_;
+    std::vector<double> pens_{0};  // where each character begins and the last one ends, in pixels
     std::size_t caret_ = 0;
     std::size_t anchor_ = 0;
     std::int32_t scroll_ = 0;  // pixels of the line that lie left of the box

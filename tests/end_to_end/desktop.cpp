@@ -96,6 +96,21 @@ void Desktop::click(::Window window, int x, int y, int times) {
     }
 }
 
+void Desktop::offerUnknownDrop(::Window window) {
+    constexpr long version = 5L << 24;
+    constexpr long unknownKind = 0x1FFFFFFF;
+    XEvent offer{};
+    offer.xclient.type = ClientMessage;
+    offer.xclient.window = window;
+    offer.xclient.message_type = XInternAtom(display_, "XdndEnter", False);
+    offer.xclient.format = 32;
+    offer.xclient.data.l[0] = static_cast<long>(root_);
+    offer.xclient.data.l[1] = version;
+    offer.xclient.data.l[2] = unknownKind;
+    XSendEvent(display_, window, False, NoEventMask, &offer);
+    XSync(display_, False);
+}
+
 // The last button of the title bar that the window manager has put above the window.
 void Desktop::clickCloseButton(::Window window) {
     XWindowAttributes attributes{};

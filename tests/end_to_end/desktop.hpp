@@ -28,6 +28,8 @@ class Desktop {
 
     void click(WindowOnScreen window, int x, int y, int times = 1);
     void clickCloseButton(WindowOnScreen window);
+    // As at the beginning of a drop, of a kind of thing that has no name.
+    void offerUnknownDrop(WindowOnScreen window);
     void press(unsigned long keysym, std::chrono::milliseconds howLong = {});
 
     void minimise(WindowOnScreen window);

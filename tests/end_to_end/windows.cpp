@@ -121,6 +121,12 @@ class Story {
         kill(game_.process(), SIGCONT);
     }
 
+    void anOfferToDropSomethingUnknownDoesNoHarm() {
+        desktop_.offerUnknownDrop(game_.window());
+        game_.begin(GameMode::Training);
+        leaveGame();
+    }
+
     void close() {
         desktop_.clickCloseButton(game_.window());
         game_.waitForExit();
@@ -190,6 +196,7 @@ int main(int argc, char** argv) {
     story.aDialogKeepsTheKeyboard();
     story.enterClosesOneDialogAPress();
     story.aDoubleClickBeginsATrainingGameAndNoMore();
+    story.anOfferToDropSomethingUnknownDoesNoHarm();
     story.aRestoredWindowHasItsPictureAtOnce();
     story.close();
     quabble::Story(argv[1]).aDestroyedDialogWasClosedAndADestroyedMainWindowEndsTheProgram();

@@ -1,4 +1,5 @@
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 
 #include <fstream>
 
@@ -87,6 +88,9 @@ TEST_F(Painters, HaveAStandInForASheetThatCannotBeUsed) {
         for (std::int32_t i = 0, j = 0; i < 14; i += j / 13, j = (j + 1) % 14)
             EXPECT_EQ(loaded.at(28 * i + 4, 4) == loaded.at(28 * j + 4, 4), file == good || i == j) << i;
     }
+    ASSERT_EQ(mkfifo(sheetFile.c_str(), 0600), 0);
+    EXPECT_FALSE(loadGraphics(folder).spriteSheet.isEmpty()) << "a pipe is not waited for";
+    std::remove(sheetFile.c_str());
 }
 
 TEST(Texts, KeysAreReplacedPairByPair) {

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "base/round_half_even.hpp"
+#include "platform/sdl/refused_drops.hpp"
 #include "platform/sdl/x11_window.hpp"
 #include "platform/window.hpp"
 
@@ -44,6 +45,7 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
         SDL_SetWindowModalFor(sdl(), owner->sdl());
     if (const auto x11 = X11Window::of(sdl())) {
         x11->setIcons(icons);
+        refuseDrops(*x11);
         if (isDialog) {
             x11->haveOnlyCloseButton();
             x11->beModal();

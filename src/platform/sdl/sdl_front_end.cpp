@@ -22,6 +22,21 @@ extern "C" void passOnHangUp(int) {
     std::raise(SIGTERM);
 }
 
+// SDL also has displays that nobody sees, and takes what the environment names. Of the pixels it can write
+// on, those with a palette or ten bits a colour stay blank.
+std::string whyUnusable() {
+    const std::string driver = SDL_GetCurrentVideoDriver();
+    if (driver != "x11" && driver != "wayland")
+        return "\"" + driver + "\" shows nothing";
+    SDL_DisplayMode mode{};
+    SDL_GetDesktopDisplayMode(0, &mode);
+    constexpr int fewestBits = 15;
+    const bool hasTenBits = SDL_PIXELLAYOUT(mode.format) == SDL_PACKEDLAYOUT_2101010;
+    if (SDL_BITSPERPIXEL(mode.format) < fewestBits || hasTenBits)
+        return std::string("its colours cannot be drawn: ") + SDL_GetPixelFormatName(mode.format);
+    return {};
+}
+
 void end(MessageLoop& loop) {
     if (!loop.requestEnd())
         std::fputs("Quabble could not save its settings and high scores.\n", stderr);
@@ -41,8 +56,14 @@ std::unique_ptr<SdlFrontEnd> SdlFrontEnd::open(std::string& problem) {
     if (version.major == 2 && version.minor < 28)
         SDL_SetHint(SDL_HINT_VIDEO_WAYLAND_ALLOW_LIBDECOR, "0");
     SDL_SetHint("SDL_VIDEO_X11_WMCLASS", "quabble");
+    SDL_SetHint(SDL_HINT_VIDEODRIVER, "x11,wayland");
     if (SDL_Init(SDL_INIT_VIDEO) != 0) {
         problem = SDL_GetError();
+        return nullptr;
+    }
+    problem = whyUnusable();
+    if (!problem.empty()) {
+        SDL_Quit();
         return nullptr;
     }
     // On X11 a window surface drawn by the processor opens at once; by way of OpenGL it takes many times as
