@@ -53,11 +53,12 @@ need_packages() {
     rm -f "$log"
 }
 
-# Configures a preset when that was not done yet (ninja sees to later changes), and builds it.
+# Configures a preset when that was not done yet (ninja sees to later changes), and builds it. With
+# QUABBLE_WARNINGS_AS_ERRORS=ON in the environment a warning ends the build.
 build_preset() {
     local log
     log=$(mktemp)
-    if { [ -f "build/$1/build.ninja" ] || cmake --preset "$1"; } >"$log" 2>&1 &&
+    if { [ -f "build/$1/build.ninja" ] || cmake --preset "$1" ${QUABBLE_WARNINGS_AS_ERRORS:+"-DQUABBLE_WARNINGS_AS_ERRORS=$QUABBLE_WARNINGS_AS_ERRORS"}; } >"$log" 2>&1 &&
         cmake --build --preset "$1" >>"$log" 2>&1; then
         rm -f "$log"
     else

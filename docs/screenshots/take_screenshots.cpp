@@ -1,5 +1,6 @@
 // Takes the screenshots of the documentation from the program itself, on a machine without a screen, so that
-// they are the same wherever they are taken: take_screenshots PROGRAM_FOLDER PICTURE_FOLDER
+// they are the same wherever they are taken: take_screenshots PROGRAM_FOLDER PICTURE_FOLDER FRAME_FOLDER
+// The frames are those of a bomb that goes off.
 
 #include <stb/stb_image_write.h>
 
@@ -46,12 +47,29 @@ class Photographer {
             const auto place = largestCluster(smallest);
             if (!place)
                 return false;
-            const bool isTraining = app_.game.gameMode == GameMode::Training;
-            const int top = isTraining ? 37 : 31;
-            user_.click(static_cast<float>(232 + 28 * (place->column - 1) + 14),
-                        static_cast<float>(top + 28 * (place->row - 1) + 14));
+            click(*place);
             if (i + 1 < moves)
                 user_.wait(1s);
+        }
+        return true;
+    }
+
+    // Clicks the first bomb and takes a picture of what follows, from the moment before to the row that
+    // enters.
+    bool takeBomb() {
+        std::optional<CellPosition> bomb;
+        app_.game.grid.forEachCell([&](CellPosition place, const GridCell& cell) {
+            if (cell.kind == CellKind::Bomb)
+                bomb = place;
+        });
+        if (!bomb || !take("bomb_0"))
+            return false;
+        click(*bomb);
+        int frame = 0;
+        for (const milliseconds later : {0ms, 75ms, 75ms, 75ms, 100ms, 250ms, 250ms, 220ms}) {
+            user_.wait(later);
+            if (!take("bomb_" + std::to_string(++frame)))
+                return false;
         }
         return true;
     }
@@ -71,6 +89,12 @@ class Photographer {
     }
 
  private:
+    void click(CellPosition place) {
+        const int top = app_.game.gameMode == GameMode::Training ? 37 : 31;
+        user_.click(static_cast<float>(232 + 28 * (place.column - 1) + 14),
+                    static_cast<float>(top + 28 * (place.row - 1) + 14));
+    }
+
     std::optional<CellPosition> largestCluster(std::int16_t smallest) const {
         std::optional<CellPosition> best;
         std::int16_t size = smallest;
@@ -93,7 +117,8 @@ class Photographer {
     Task<> program_ = runProgram(app_);
 };
 
-bool takeAll(const std::string& programFolder, const std::string& pictureFolder) {
+bool takeAll(const std::string& programFolder, const std::string& pictureFolder,
+             const std::string& frameFolder) {
     bool isGood = true;
     {
         Photographer menu(programFolder, pictureFolder, 1);
@@ -120,6 +145,11 @@ bool takeAll(const std::string& programFolder, const std::string& pictureFolder)
         }
         isGood &= timed.take("timed_game");
     }
+    {
+        Photographer bomb(programFolder, frameFolder, 8);
+        bomb.startAtLevel(3, 4);
+        isGood &= bomb.takeBomb();
+    }
     Photographer strategy(programFolder, pictureFolder, 4);
     strategy.startAtLevel(3, 5);
     strategy.play(4, 3);
@@ -131,8 +161,10 @@ bool takeAll(const std::string& programFolder, const std::string& pictureFolder)
 }  // namespace quabble
 
 int main(int count, char** arguments) {
-    if (count != 3 || !quabble::takeAll(arguments[1], arguments[2])) {
-        std::fputs("take_screenshots PROGRAM_FOLDER PICTURE_FOLDER: could not write the pictures\n", stderr);
+    if (count != 4 || !quabble::takeAll(arguments[1], arguments[2], arguments[3])) {
+        std::fputs(
+            "take_screenshots PROGRAM_FOLDER PICTURE_FOLDER FRAME_FOLDER: could not write the pictures\n",
+            stderr);
         return EXIT_FAILURE;
     }
     return EXIT_SUCCESS;
