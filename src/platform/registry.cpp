@@ -95,7 +95,7 @@ std::optional<RegistryKey> Registry::openKey(std::string_view name, Access acces
 }
 
 RegistryKey RegistryKey::createKey(std::string_view subkey, std::string_view classString) const {
-    return RegistryKey(database_, path_ + "\\" + std::string(subkey), std::string(classString));
+    return {database_, path_ + "\\" + std::string(subkey), std::string(classString)};
 }
 
 bool RegistryKey::createWithParents() {

@@ -1,5 +1,9 @@
 #include "platform/registry_database.hpp"
 
+#include <algorithm>
+#include <array>
+#include <utility>
+
 namespace quabble {
 namespace {
 
@@ -74,10 +78,12 @@ std::unique_ptr<RegistryDatabase> RegistryDatabase::connect(const std::string& p
 bool RegistryDatabase::trustNothing() {
     sqlite3* connection = connection_.get();
     sqlite3_limit(connection, SQLITE_LIMIT_LENGTH, longestValue);
-    return sqlite3_db_config(connection, SQLITE_DBCONFIG_DEFENSIVE, 1, nullptr) == SQLITE_OK &&
-           sqlite3_db_config(connection, SQLITE_DBCONFIG_TRUSTED_SCHEMA, 0, nullptr) == SQLITE_OK &&
-           sqlite3_db_config(connection, SQLITE_DBCONFIG_ENABLE_TRIGGER, 0, nullptr) == SQLITE_OK &&
-           sqlite3_db_config(connection, SQLITE_DBCONFIG_ENABLE_VIEW, 0, nullptr) == SQLITE_OK;
+    constexpr std::array switches{
+        std::pair{SQLITE_DBCONFIG_DEFENSIVE, 1}, std::pair{SQLITE_DBCONFIG_TRUSTED_SCHEMA, 0},
+        std::pair{SQLITE_DBCONFIG_ENABLE_TRIGGER, 0}, std::pair{SQLITE_DBCONFIG_ENABLE_VIEW, 0}};
+    return std::ranges::all_of(switches, [&](const auto& option) {
+        return sqlite3_db_config(connection, option.first, option.second, nullptr) == SQLITE_OK;
+    });
 }
 
 std::unique_ptr<RegistryDatabase> RegistryDatabase::open(const std::string& path, Access access) {

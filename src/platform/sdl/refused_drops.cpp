@@ -2,26 +2,39 @@
 
 #include <X11/Xlibint.h>  // last: it has macros named min and max
 
+#include <cassert>
+
 namespace quabble {
 namespace {
 
 using Convert = Bool (*)(Display*, XEvent*, xEvent*);
-Convert convertMessage;
-Atom dropOffered;
+
+struct Refusal {
+    Convert convertMessage = nullptr;
+    Atom dropOffered = None;
+};
+
+// Xlib's conversions have no argument of ours.
+Refusal& refusal() {
+    static Refusal kept;
+    return kept;
+}
 
 Bool convertUnlessDropOffered(Display* display, XEvent* event, xEvent* sent) {
-    if (sent->u.clientMessage.u.l.type == dropOffered)
+    const Convert convert = refusal().convertMessage;
+    assert(convert != nullptr);
+    if (sent->u.clientMessage.u.l.type == refusal().dropOffered)
         return False;
-    return convertMessage(display, event, sent);
+    return convert(display, event, sent);
 }
 
 }  // namespace
 
 void refuseDrops(const X11Window& window) {
-    if (convertMessage != nullptr)
+    if (refusal().convertMessage != nullptr)
         return;
-    dropOffered = XInternAtom(window.display(), "XdndEnter", False);
-    convertMessage = XESetWireToEvent(window.display(), ClientMessage, convertUnlessDropOffered);
+    refusal().dropOffered = XInternAtom(window.display(), "XdndEnter", False);
+    refusal().convertMessage = XESetWireToEvent(window.display(), ClientMessage, convertUnlessDropOffered);
 }
 
 }  // namespace quabble
