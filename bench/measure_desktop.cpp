@@ -20,8 +20,8 @@
 #include <vector>
 
 #include "desktop.hpp"
+#include "draw/bitmap_file.hpp"
 #include "gfx/sprite_sheet.hpp"
-#include "platform/bitmap_file.hpp"
 #include "report.hpp"
 
 namespace quabble::bench {

@@ -6,8 +6,8 @@
 
 #include "app/program.hpp"
 #include "heap_count.hpp"
+#include "hosts/headless/scripted_user.hpp"
 #include "measure_rooms.hpp"
-#include "platform/headless/scripted_user.hpp"
 #include "report.hpp"
 
 namespace quabble::bench {

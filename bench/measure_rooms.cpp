@@ -19,7 +19,7 @@
 #include "engine/game.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/sprite_sheet.hpp"
-#include "platform/sdl/sdl_front_end.hpp"
+#include "hosts/desktop/sdl_front_end.hpp"
 #include "platform/timer.hpp"
 #include "platform/window.hpp"
 #include "quiet_stage.hpp"

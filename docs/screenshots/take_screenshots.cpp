@@ -10,7 +10,7 @@
 #include <vector>
 
 #include "app/program.hpp"
-#include "platform/headless/scripted_user.hpp"
+#include "hosts/headless/scripted_user.hpp"
 
 namespace quabble {
 namespace {

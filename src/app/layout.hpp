@@ -2,9 +2,9 @@
 
 #include <vector>
 
+#include "draw/canvas.hpp"
+#include "draw/geometry.hpp"
 #include "gfx/screen_button.hpp"
-#include "platform/canvas.hpp"
-#include "platform/geometry.hpp"
 
 namespace quabble {
 

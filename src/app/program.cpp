@@ -2,7 +2,6 @@
 
 #include <filesystem>
 
-#include "app/icon.hpp"
 #include "app/splash.hpp"
 
 namespace quabble {
@@ -17,7 +16,6 @@ std::string withSeparator(std::string folder) {
 }
 
 Task<> Main(AppState& app) {
-    app.loop.frontEnd().setIcons(applicationIcons());
     app.programFolder = withSeparator(app.loop.frontEnd().executableFolder());
     if (app.load() == StoreResult::NotOpened)
         co_await app.tellStoreError(nullptr);

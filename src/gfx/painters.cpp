@@ -4,8 +4,8 @@
 #include <cassert>
 
 #include "base/round_half_even.hpp"
+#include "draw/text.hpp"
 #include "gfx/sprite_sheet.hpp"
-#include "platform/text.hpp"
 
 namespace quabble {
 namespace {

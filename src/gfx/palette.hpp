@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/surface.hpp"
+#include "draw/surface.hpp"
 
 namespace quabble {
 

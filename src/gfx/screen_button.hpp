@@ -3,9 +3,9 @@
 #include <cstdint>
 #include <optional>
 
+#include "draw/canvas.hpp"
+#include "draw/geometry.hpp"
 #include "gfx/palette.hpp"
-#include "platform/canvas.hpp"
-#include "platform/geometry.hpp"
 
 namespace quabble {
 

@@ -3,10 +3,10 @@
 #include <array>
 #include <optional>
 
+#include "draw/bitmap_file.hpp"
+#include "draw/text.hpp"
 #include "engine/grid_cell.hpp"
 #include "gfx/palette.hpp"
-#include "platform/bitmap_file.hpp"
-#include "platform/text.hpp"
 
 namespace quabble {
 namespace {

@@ -3,8 +3,8 @@
 #include <cstdint>
 #include <string>
 
-#include "platform/geometry.hpp"
-#include "platform/surface.hpp"
+#include "draw/geometry.hpp"
+#include "draw/surface.hpp"
 
 namespace quabble {
 

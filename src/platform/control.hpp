@@ -6,9 +6,9 @@
 #include <string_view>
 
 #include "base/task.hpp"
+#include "draw/surface.hpp"
+#include "draw/text.hpp"
 #include "platform/input_event.hpp"
-#include "platform/surface.hpp"
-#include "platform/text.hpp"
 
 namespace quabble {
 

@@ -6,8 +6,8 @@
 #include <span>
 #include <string>
 
-#include "platform/geometry.hpp"
-#include "platform/surface.hpp"
+#include "draw/geometry.hpp"
+#include "draw/surface.hpp"
 
 namespace quabble {
 
@@ -29,12 +29,6 @@ struct NativeWindow {
 
 enum class PointerShape { Arrow, Hand };
 
-// A small picture that stands for the program, four bytes a pixel: red, green, blue and opacity.
-struct Icon {
-    Size size;
-    std::span<const unsigned char> rgba;  // must outlive the program's windows
-};
-
 // The machine that the program runs on, seen from the program: what a port has to write. Everything is called
 // on the one thread of the program. Operations with a body here may be left out by a machine that lacks them.
 class FrontEnd {
@@ -53,8 +47,6 @@ class FrontEnd {
     virtual void minimiseWindow(WindowId /*window*/) {}
     // How the pointer looks over the window; at first it is an arrow.
     virtual void setPointer(WindowId /*window*/, PointerShape /*shape*/) {}
-    // The icon, in several sizes, of all windows that are made from now on.
-    virtual void setIcons(std::span<const Icon> /*icons*/) {}
     // Of the first screen.
     virtual Size screenSize() { return {1024, 768}; }
 

@@ -4,7 +4,7 @@
 #include <cmath>
 #include <ranges>
 
-#include "platform/windows_1252.hpp"
+#include "draw/windows_1252.hpp"
 
 namespace quabble {
 namespace {

@@ -7,7 +7,7 @@
 #include <vector>
 
 #include "base/task.hpp"
-#include "platform/canvas.hpp"
+#include "draw/canvas.hpp"
 #include "platform/control.hpp"
 #include "platform/input_event.hpp"
 #include "platform/message_loop.hpp"

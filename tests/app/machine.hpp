@@ -8,7 +8,7 @@
 #include "../support/files.hpp"
 #include "app/program.hpp"
 #include "gfx/painters.hpp"
-#include "platform/headless/scripted_user.hpp"
+#include "hosts/headless/scripted_user.hpp"
 
 namespace quabble {
 

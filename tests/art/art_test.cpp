@@ -7,8 +7,8 @@
 
 #include "base/round_half_even.hpp"
 #include "colour_vision.hpp"
-#include "platform/bitmap_file.hpp"
-#include "platform/scaling.hpp"
+#include "draw/bitmap_file.hpp"
+#include "draw/scaling.hpp"
 
 namespace quabble {
 namespace {

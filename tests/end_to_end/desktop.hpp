@@ -4,7 +4,7 @@
 #include <functional>
 #include <string>
 
-#include "platform/surface.hpp"
+#include "draw/surface.hpp"
 
 struct _XDisplay;
 

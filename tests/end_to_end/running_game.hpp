@@ -6,8 +6,8 @@
 #include <vector>
 
 #include "desktop.hpp"
+#include "draw/surface.hpp"
 #include "engine/game_state.hpp"
-#include "platform/surface.hpp"
 
 namespace quabble {
 

@@ -3,7 +3,7 @@
 #include <cassert>
 #include <span>
 
-#include "platform/bitmap_file.hpp"
+#include "draw/bitmap_file.hpp"
 
 extern "C" int LLVMFuzzerTestOneInput(const unsigned char* data, std::size_t size) {
     const auto picture = quabble::decodeBitmap(std::as_bytes(std::span(data, size)));

@@ -4,10 +4,10 @@
 #include <cassert>
 #include <string>
 
+#include "draw/windows_1252.hpp"
 #include "gfx/message_template.hpp"
-#include "platform/headless/headless_front_end.hpp"
+#include "hosts/headless/headless_front_end.hpp"
 #include "platform/text_box.hpp"
-#include "platform/windows_1252.hpp"
 
 namespace quabble {
 namespace {

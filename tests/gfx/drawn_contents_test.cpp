@@ -8,7 +8,7 @@
 #include "gfx/result_dialog.hpp"
 #include "gfx/sprite_sheet.hpp"
 #include "gfx/string_table.hpp"
-#include "platform/headless/scripted_user.hpp"
+#include "hosts/headless/scripted_user.hpp"
 
 namespace quabble {
 namespace {

@@ -1,6 +1,6 @@
 #include <gtest/gtest.h>
 
-#include "platform/headless/scripted_user.hpp"
+#include "hosts/headless/scripted_user.hpp"
 #include "platform/timer.hpp"
 #include "platform/window.hpp"
 

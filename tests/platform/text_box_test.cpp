@@ -4,7 +4,7 @@
 
 #include <cstdlib>
 
-#include "platform/headless/headless_front_end.hpp"
+#include "hosts/headless/headless_front_end.hpp"
 
 namespace quabble {
 namespace {

@@ -1,0 +1,121 @@
+#include "draw/scaling.hpp"
+
+#include <algorithm>
+#include <cmath>
+#include <cstring>
+
+#include "base/round_half_even.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr double plainDotsPerInch = 96;
+constexpr double stepsToOne = 4;
+
+struct Division {
+    std::int64_t quotient = 0;
+    std::int64_t rest = 0;  // never negative
+};
+
+Division floorDivision(std::int64_t dividend, std::int64_t divisor) {
+    const std::int64_t rest = (dividend % divisor + divisor) % divisor;
+    return {(dividend - rest) / divisor, rest};
+}
+
+std::uint32_t mixed(std::uint32_t one, std::uint32_t other, std::uint32_t weight) {
+    constexpr std::uint32_t redAndBlue = 0xFF00FF;
+    constexpr std::uint32_t green = 0x00FF00;
+    const std::uint32_t rest = 256 - weight;
+    return (((one & redAndBlue) * rest + (other & redAndBlue) * weight) >> 8 & redAndBlue) |
+           (((one & green) * rest + (other & green) * weight) >> 8 & green);
+}
+
+// A pixel is seen where its centre is.
+std::int32_t pixelSeenAt(std::int32_t at, std::int32_t window, std::int32_t picture) {
+    const std::int64_t centre = (2 * std::int64_t{at} + 1) * picture;
+    return static_cast<std::int32_t>(floorDivision(centre, 2 * std::int64_t{window}).quotient);
+}
+
+}  // namespace
+
+double scaleFor(double dotsPerInch, Size picture, Size available) {
+    const double wanted =
+        std::max(roundHalfEven(dotsPerInch / plainDotsPerInch * stepsToOne) / stepsToOne, 1.0);
+    const double largest = std::min(static_cast<double>(available.width) / picture.width,
+                                    static_cast<double>(available.height) / picture.height);
+    if (wanted <= largest || largest <= 0)
+        return wanted;
+    return largest < 1 ? largest : std::floor(largest * stepsToOne) / stepsToOne;
+}
+
+Size scaled(Size size, double scale) {
+    return {roundHalfEven(size.width * scale), roundHalfEven(size.height * scale)};
+}
+
+Point pixelSeenAt(Point shown, Size window, Size picture) {
+    return {pixelSeenAt(shown.x, window.width, picture.width),
+            pixelSeenAt(shown.y, window.height, picture.height)};
+}
+
+Magnifier::Magnifier(Size picture, Size shown)
+    : picture_(picture),
+      shown_(shown),
+      columns_(mixes(picture.width, shown.width)),
+      rows_(mixes(picture.height, shown.height)) {}
+
+std::vector<Magnifier::Mix> Magnifier::mixes(std::int32_t from, std::int32_t to) {
+    const std::int64_t times = (std::int64_t{to} + from - 1) / from;
+    std::vector<Mix> mixes;
+    for (std::int32_t i = 0; i < to; ++i) {
+        const Division centre =
+            floorDivision((2 * std::int64_t{i} + 1) * times * from - to, 2 * std::int64_t{to});
+        const auto pixel = [&](std::int64_t repeated) {
+            return static_cast<std::int32_t>(std::clamp<std::int64_t>(repeated / times, 0, from - 1));
+        };
+        const std::int32_t first = pixel(centre.quotient);
+        const auto weight = static_cast<std::uint32_t>(centre.rest * 256 / (2 * std::int64_t{to}));
+        mixes.push_back({first, weight == 0 ? first : pixel(centre.quotient + 1), weight});
+    }
+    return mixes;
+}
+
+void Magnifier::show(const Surface& picture, std::uint32_t* pixels, std::ptrdiff_t stride) {
+    const auto width = static_cast<std::size_t>(shown_.width);
+    for (Row& row : latest_)
+        row.of = -1;
+    for (std::int32_t y = 0; y < shown_.height; ++y) {
+        auto* line = reinterpret_cast<std::uint32_t*>(reinterpret_cast<std::byte*>(pixels) +
+                                                      std::ptrdiff_t{y} * stride);
+        if (shown_ == picture_) {
+            std::memcpy(line, picture.row(y).data(), width * sizeof(std::uint32_t));
+            continue;
+        }
+        const Mix& mix = rows_[static_cast<std::size_t>(y)];
+        const std::uint32_t* first = widened(picture, mix.first).pixels.data();
+        if (mix.first == mix.second) {
+            std::memcpy(line, first, width * sizeof(std::uint32_t));
+            continue;
+        }
+        const std::uint32_t* second = widened(picture, mix.second).pixels.data();
+        for (std::size_t x = 0; x < width; ++x)
+            line[x] = mixed(first[x], second[x], mix.weight);
+    }
+}
+
+// Neighbouring rows follow each other, so that the last even and the last odd one are all that is needed
+// again.
+const Magnifier::Row& Magnifier::widened(const Surface& picture, std::int32_t y) {
+    Row& row = latest_[y % 2];
+    if (row.of == y)
+        return row;
+    row.of = y;
+    row.pixels.clear();
+    const auto from = picture.row(y);
+    for (const Mix& mix : columns_) {
+        row.pixels.push_back(mixed(from[static_cast<std::size_t>(mix.first)],
+                                   from[static_cast<std::size_t>(mix.second)], mix.weight));
+    }
+    return row;
+}
+
+}  // namespace quabble
