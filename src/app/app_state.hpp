@@ -44,7 +44,7 @@ class AppState {
     NameEntry& diagUN();
     ScoreView& frmStats();
 
-    // Hands a file or an address to the desktop; what becomes of it is not our business.
+    // Hands a file or an address to the desktop; no error is reported.
     void openDocument(const std::string& document);
 
     // The settings as the registry has them, and back.

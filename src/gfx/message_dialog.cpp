@@ -17,7 +17,7 @@ constexpr std::int32_t leastWidth = 260;
 }  // namespace
 
 MessageDialog::MessageDialog(MessageLoop& loop, Window* owner, std::string title, std::string text)
-    : Window(loop, owner), title_(std::move(title)), text_(std::move(text)) {}
+    : OkDialog(loop, owner), title_(std::move(title)), text_(std::move(text)) {}
 
 void MessageDialog::Form_Load() {
     const std::int32_t width = std::max(leastWidth, measureText(text_, messageFont).width + 2 * margin);
@@ -35,27 +35,6 @@ void MessageDialog::Form_Load() {
     drawShadowText(label, 1, text_, text_format::centre);
     okBox_ = layOutOkButton(canvas(), (width - okButtonSize.width) / 2, buttonTop);
     drawOkButton(okBox_);
-}
-
-Task<> MessageDialog::Form_MouseDown(float x, float y) {
-    if (hitTest(okBox_, x, y))
-        unload();
-    co_return;
-}
-
-Task<> MessageDialog::Form_MouseMove(float x, float y) {
-    const bool over = hitTest(okBox_, x, y);
-    if (over == okBox_.hovered)
-        co_return;
-    okBox_.hovered = over;
-    drawOkButton(okBox_);
-    refresh();
-}
-
-Task<> MessageDialog::Form_KeyPress(std::int16_t key) {
-    if (key == keys::enter || key == keys::escape)
-        unload();
-    co_return;
 }
 
 }  // namespace quabble

@@ -39,7 +39,7 @@ std::string resultText(const GameState& game, bool goNextLevel) {
 }
 
 ResultDialog::ResultDialog(MessageLoop& loop, Window& owner, const GameState& game, std::int16_t layoutUnit)
-    : Window(loop, &owner), game_(game), layoutUnit_(layoutUnit) {}
+    : OkDialog(loop, &owner), game_(game), layoutUnit_(layoutUnit) {}
 
 void ResultDialog::Form_Load() {
     setCaption("Game Statistics");
@@ -62,27 +62,6 @@ void ResultDialog::layOut() {
                  .height = height - 4 * u,
                  .textColour = palette::panelTextColour};
     okBox_ = layOutOkButton(canvas(), roundHalfEven((width - okButtonSize.width) / 2.0), height - 2 * u);
-}
-
-Task<> ResultDialog::Form_MouseDown(float x, float y) {
-    if (hitTest(okBox_, x, y))
-        unload();
-    co_return;
-}
-
-Task<> ResultDialog::Form_MouseMove(float x, float y) {
-    const bool over = hitTest(okBox_, x, y);
-    if (over == okBox_.hovered)
-        co_return;
-    okBox_.hovered = over;
-    drawOkButton(okBox_);
-    refresh();
-}
-
-Task<> ResultDialog::Form_KeyPress(std::int16_t key) {
-    if (key == keys::enter || key == keys::escape)
-        unload();
-    co_return;
 }
 
 }  // namespace quabble

@@ -4,8 +4,7 @@
 #include <string>
 
 #include "engine/game_state.hpp"
-#include "gfx/screen_button.hpp"
-#include "platform/window.hpp"
+#include "gfx/ok_dialog.hpp"
 
 namespace quabble {
 
@@ -14,7 +13,7 @@ namespace quabble {
 std::string resultText(const GameState& game, bool goNextLevel);
 
 // The dialog that reports the outcome of a game or of an arcade level. Closing it is its only result.
-class ResultDialog final : public Window {
+class ResultDialog final : public OkDialog {
  public:
     // The loop, the owner and the game must outlive the dialog.
     ResultDialog(MessageLoop& loop, Window& owner, const GameState& game, std::int16_t layoutUnit);
@@ -23,10 +22,6 @@ class ResultDialog final : public Window {
 
  private:
     void Form_Load() override;
-    bool isClickable(float x, float y) const override { return hitTest(okBox_, x, y); }
-    Task<> Form_MouseDown(float x, float y) override;
-    Task<> Form_MouseMove(float x, float y) override;
-    Task<> Form_KeyPress(std::int16_t key) override;
 
     void layOut();
 
@@ -34,7 +29,6 @@ class ResultDialog final : public Window {
     std::int16_t layoutUnit_;
     ScreenButton frameBox_;
     ScreenButton statsBox_;
-    ScreenButton okBox_;
 };
 
 }  // namespace quabble

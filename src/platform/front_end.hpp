@@ -51,7 +51,7 @@ class FrontEnd {
     virtual Size screenSize() { return {1024, 768}; }
 
     // Opens a file or an address with whatever program the desktop has for it, in the given folder, and comes
-    // back at once. Nobody hears of it when that fails.
+    // back at once. That it fails is not reported.
     virtual void openDocument(const std::string& /*document*/, const std::string& /*folder*/) {}
 
     // While a window has an area where text is typed, typed text comes as events, and what an input method

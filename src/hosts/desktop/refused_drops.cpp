@@ -1,6 +1,6 @@
 #include "hosts/desktop/refused_drops.hpp"
 
-#include <X11/Xlibint.h>  // last: it has macros named min and max
+#include <X11/Xlibint.h>  // its macros named min and max are no trouble to <cassert>
 
 #include <cassert>
 

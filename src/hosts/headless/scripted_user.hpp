@@ -21,7 +21,7 @@ class ScriptedUser {
     void drag(float fromX, float fromY, float toX, float toY);
     void movePointer(float x, float y) { act(EventKind::MouseMove, x, y); }
     void press(std::int16_t key);
-    void type(const std::string& utf8);  // in vain where no text is asked for
+    void type(const std::string& utf8);  // ignored where no text is asked for
     void edit(EditCommand command, bool extends = false);
     void clickCloseButton() { act(EventKind::CloseButton); }
     void minimise() { frontEnd_.minimiseWindow(topWindow()), loop_.wake(); }

@@ -1,0 +1,28 @@
+#include "gfx/ok_dialog.hpp"
+
+#include "gfx/ok_button.hpp"
+
+namespace quabble {
+
+Task<> OkDialog::Form_MouseDown(float x, float y) {
+    if (hitTest(okBox_, x, y))
+        unload();
+    co_return;
+}
+
+Task<> OkDialog::Form_MouseMove(float x, float y) {
+    const bool over = hitTest(okBox_, x, y);
+    if (over == okBox_.hovered)
+        co_return;
+    okBox_.hovered = over;
+    drawOkButton(okBox_);
+    refresh();
+}
+
+Task<> OkDialog::Form_KeyPress(std::int16_t key) {
+    if (key == keys::enter || key == keys::escape)
+        unload();
+    co_return;
+}
+
+}  // namespace quabble
