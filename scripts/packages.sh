@@ -21,7 +21,7 @@ packages_of() {
     esac
     [ "$2" != package ] || list+=" dpkg-dev lintian desktop-file-utils appstream man-db groff"
     [ "$2" != check ] ||
-        list+=" libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 cppcheck valgrind xvfb openbox icewm xdotool x11-xserver-utils libxtst-dev"
+        list+=" libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 cppcheck valgrind apngasm xvfb openbox icewm xdotool x11-xserver-utils libxtst-dev"
     printf '%s' "$list"
 }
 

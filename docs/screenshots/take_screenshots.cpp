@@ -1,11 +1,13 @@
 // Takes the screenshots of the documentation from the program itself, on a machine without a screen, so that
-// they are the same wherever they are taken: take_screenshots PROGRAM_FOLDER PICTURE_FOLDER FRAME_FOLDER
-// The frames are those of a bomb that goes off.
+// they are the same wherever they are taken, and films a bomb: take_screenshots PROGRAM_FOLDER PICTURE_FOLDER
+// FILM_FOLDER
 
 #include <stb/stb_image_write.h>
 
 #include <cstdio>
 #include <cstdlib>
+#include <fstream>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -16,6 +18,18 @@ namespace quabble {
 namespace {
 
 using namespace std::chrono_literals;
+
+bool writePicture(const std::string& file, const Surface& picture) {
+    std::vector<unsigned char> bytes;
+    for (std::int32_t y = 0; y < picture.height(); ++y) {
+        for (const std::uint32_t pixel : picture.row(y)) {
+            const Colour colour = colourOf(pixel);
+            bytes.insert(bytes.end(), {colour.red, colour.green, colour.blue});
+        }
+    }
+    return stbi_write_png(file.c_str(), picture.width(), picture.height(), 3, bytes.data(),
+                          picture.width() * 3) != 0;
+}
 
 // A player who always takes the largest cluster, and someone with a camera.
 class Photographer {
@@ -54,38 +68,40 @@ class Photographer {
         return true;
     }
 
-    // Clicks the first bomb and takes a picture of what follows, from the moment before to the row that
-    // enters.
-    bool takeBomb() {
+    bool take(const std::string& name) {
+        return writePicture(pictureFolder_ + "/" + name + ".png", user_.top().picture);
+    }
+
+    // Clicks a bomb and films what comes of it, with a moment of rest before and after: numbered pictures,
+    // and beside each a text that tells apngasm how long it is shown.
+    bool filmBomb(const std::string& folder) {
         std::optional<CellPosition> bomb;
         app_.game.grid.forEachCell([&](CellPosition place, const GridCell& cell) {
             if (cell.kind == CellKind::Bomb)
                 bomb = place;
         });
-        if (!bomb || !take("bomb_0"))
+        if (!bomb)
             return false;
-        click(*bomb);
-        int frame = 0;
-        for (const milliseconds later : {0ms, 75ms, 75ms, 75ms, 100ms, 250ms, 250ms, 220ms}) {
-            user_.wait(later);
-            if (!take("bomb_" + std::to_string(++frame)))
-                return false;
-        }
-        return true;
-    }
-
-    bool take(const std::string& name) {
-        const Surface& picture = user_.top().picture;
-        std::vector<unsigned char> bytes;
-        for (std::int32_t y = 0; y < picture.height(); ++y) {
-            for (const std::uint32_t pixel : picture.row(y)) {
-                const Colour colour = colourOf(pixel);
-                bytes.insert(bytes.end(), {colour.red, colour.green, colour.blue});
+        constexpr milliseconds clicked = 1s;
+        constexpr milliseconds end = 4s;
+        constexpr milliseconds step = 25ms;
+        bool isGood = true;
+        int number = 10;  // of two digits, so that the names are in order
+        milliseconds since{};
+        Surface shown = boardPicture();
+        for (milliseconds time{}; time <= end; time += step) {
+            if (time == clicked)
+                click(*bomb);
+            if (boardPicture() != shown || time == end) {
+                const std::string file = folder + "/" + std::to_string(number++);
+                isGood &= writePicture(file + ".png", shown);
+                std::ofstream(file + ".txt") << "delay=" << (time - since).count() << "/1000\n";
+                shown = boardPicture();
+                since = time;
             }
+            user_.wait(step);
         }
-        const std::string file = pictureFolder_ + "/" + name + ".png";
-        return stbi_write_png(file.c_str(), picture.width(), picture.height(), 3, bytes.data(),
-                              picture.width() * 3) != 0;
+        return isGood;
     }
 
  private:
@@ -93,6 +109,13 @@ class Photographer {
         const int top = app_.game.gameMode == GameMode::Training ? 37 : 31;
         user_.click(static_cast<float>(232 + 28 * (place.column - 1) + 14),
                     static_cast<float>(top + 28 * (place.row - 1) + 14));
+    }
+
+    // The lower part of the arcade board, and the waiting row.
+    Surface boardPicture() const {
+        Surface picture(400, 375);
+        picture.copy(picture.bounds(), user_.top().picture, {200, 165});
+        return picture;
     }
 
     std::optional<CellPosition> largestCluster(std::int16_t smallest) const {
@@ -118,7 +141,7 @@ class Photographer {
 };
 
 bool takeAll(const std::string& programFolder, const std::string& pictureFolder,
-             const std::string& frameFolder) {
+             const std::string& filmFolder) {
     bool isGood = true;
     {
         Photographer menu(programFolder, pictureFolder, 1);
@@ -145,16 +168,12 @@ bool takeAll(const std::string& programFolder, const std::string& pictureFolder,
         }
         isGood &= timed.take("timed_game");
     }
-    {
-        Photographer bomb(programFolder, frameFolder, 8);
-        bomb.startAtLevel(3, 4);
-        isGood &= bomb.takeBomb();
-    }
     Photographer strategy(programFolder, pictureFolder, 4);
     strategy.startAtLevel(3, 5);
     strategy.play(4, 3);
     strategy.wait(1s);
-    return strategy.take("strategy_game") && isGood;
+    isGood &= strategy.take("strategy_game");
+    return strategy.filmBomb(filmFolder) && isGood;
 }
 
 }  // namespace
@@ -163,7 +182,7 @@ bool takeAll(const std::string& programFolder, const std::string& pictureFolder,
 int main(int count, char** arguments) {
     if (count != 4 || !quabble::takeAll(arguments[1], arguments[2], arguments[3])) {
         std::fputs(
-            "take_screenshots PROGRAM_FOLDER PICTURE_FOLDER FRAME_FOLDER: could not write the pictures\n",
+            "take_screenshots PROGRAM_FOLDER PICTURE_FOLDER FILM_FOLDER: could not write the pictures\n",
             stderr);
         return EXIT_FAILURE;
     }
