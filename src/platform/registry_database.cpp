@@ -126,21 +126,25 @@ bool RegistryDatabase::commit() {
     return isKept_ && execute("COMMIT");
 }
 
+// The tables are compared before anything is looked for in them.
 RegistryDatabase::Content RegistryDatabase::content() {
-    RegistryStatement check = prepare("PRAGMA integrity_check(1)");
     RegistryStatement version = prepare("PRAGMA user_version");
-    const bool isSound = check.nextRow() && check.bytes(0) == "ok" && version.nextRow();
-    if (!isSound)
+    if (!version.nextRow())
         return Content::SomethingElse;
     std::string found;
     RegistryStatement schema =
         prepare("SELECT sql FROM sqlite_schema WHERE sql IS NOT NULL ORDER BY name DESC");
     while (schema.nextRow())
         found += withoutSpace(schema.bytes(0));
-    if (version.number(0) == 0 && found.empty())
-        return Content::Nothing;
-    const bool isOurs = found == withoutSpace(keysTable) + withoutSpace(entriesTable);
-    return isOurs && version.number(0) == schemaVersion ? Content::Registry : Content::SomethingElse;
+    const bool isNothing = version.number(0) == 0 && found.empty();
+    const bool isOurs =
+        version.number(0) == schemaVersion && found == withoutSpace(keysTable) + withoutSpace(entriesTable);
+    if (!isNothing && !isOurs)
+        return Content::SomethingElse;
+    RegistryStatement check = prepare("PRAGMA integrity_check(1)");
+    if (!check.nextRow() || check.bytes(0) != "ok")
+        return Content::SomethingElse;
+    return isOurs ? Content::Registry : Content::Nothing;
 }
 
 bool RegistryDatabase::execute(const char* sql) {
