@@ -4,18 +4,20 @@
 #include <cstddef>
 
 namespace {
-std::atomic<std::uint64_t> blocks{0};
+std::atomic<std::int64_t> blocks{0};
 }
 
-std::uint64_t quabble::bench::heapBlocks() {
+std::int64_t quabble::bench::heapBlocks() {
     return blocks;
 }
 
-// The C library's own heap under its inner names, with a count in front. `new` comes by here as well.
+// The C library's own heap under its inner names, with a count in front. `new` and `delete` come by here as
+// well.
 extern "C" {
 void* __libc_malloc(std::size_t size);
 void* __libc_calloc(std::size_t count, std::size_t size);
 void* __libc_realloc(void* block, std::size_t size);
+void __libc_free(void* block);
 
 void* malloc(std::size_t size) {
     ++blocks;
@@ -26,7 +28,11 @@ void* calloc(std::size_t count, std::size_t size) {
     return __libc_calloc(count, size);
 }
 void* realloc(void* block, std::size_t size) {
-    ++blocks;
+    blocks += block == nullptr;
     return __libc_realloc(block, size);
+}
+void free(void* block) {
+    blocks -= block != nullptr;
+    __libc_free(block);
 }
 }

@@ -4,7 +4,7 @@
 
 namespace quabble::bench {
 
-// How many blocks this process has asked the heap for, by whatever means.
-std::uint64_t heapBlocks();
+// How many blocks of the heap this process has now, by whatever means it asked for them.
+std::int64_t heapBlocks();
 
 }  // namespace quabble::bench

@@ -1,11 +1,14 @@
-// How many heap blocks the program asks for while it runs, on the machine without a screen.
+// How many heap blocks more the program has after something was done than before, on the machine without a
+// screen.
 
 #include <array>
 #include <functional>
 #include <string>
 
+#include "../tests/support/files.hpp"
 #include "app/program.hpp"
 #include "heap_count.hpp"
+#include "hosts/headless/memory_blob.hpp"
 #include "hosts/headless/scripted_user.hpp"
 #include "measure_rooms.hpp"
 #include "report.hpp"
@@ -17,8 +20,7 @@ using namespace std::chrono_literals;
 
 // The program on its main menu, with high scores that are out of reach. Buttons are counted from 1.
 struct Machine {
-    explicit Machine(const std::string& programFolder) : frontEnd(programFolder) {
-        frontEnd.connect(loop);
+    explicit Machine(const std::string& programFolder) : frontEnd(picturesIn(programFolder)) {
         program.start();
         user.wait(1min);
         for (std::int16_t table = 1; table <= highScoreTables; ++table)
@@ -53,22 +55,23 @@ struct Machine {
     }
 
     HeadlessFrontEnd frontEnd;
-    MessageLoop loop{frontEnd};
-    Registry registry = Registry::inMemory();
-    AppState app{loop, registry, 1};
-    ScriptedUser user{frontEnd, loop};
-    Task<> program = runProgram(app);
+    MemoryBlob kept;
+    BlobRegistryStore registry{kept};
+    Program program{frontEnd, registry, 1};
+    ScriptedUser<Program> user{frontEnd, program};
+    AppState& app = program.state();
 };
 
-// Does a thing three times, each time in the state that `prepare` makes, and counts the third.
+// Does a thing three times, each time in the state that `prepare` makes, and counts what the third leaves
+// behind.
 void count(const std::string& what, const std::function<void()>& prepare, const std::function<void()>& act) {
-    std::uint64_t before = 0;
+    std::int64_t before = 0;
     for (int i = 0; i < 3; ++i) {
         prepare();
         before = heapBlocks();
         act();
     }
-    report("heap blocks: " + what, static_cast<double>(heapBlocks() - before), 0, "", {});
+    report("heap blocks left by: " + what, static_cast<double>(heapBlocks() - before), 0, "", {});
 }
 
 }  // namespace
@@ -78,7 +81,7 @@ void measureHeap(const std::string& programFolder) {
     const auto nothing = [] {};
     const auto hover = [&] { machine.pointAtAll(); };
 
-    count("main menu drawn", nothing, [&] { machine.app.frmQuabble().showMainMenu(); });
+    count("main menu drawn", nothing, [&] { machine.program.frmQuabble().showMainMenu(); });
     count("pointer over the main menu", nothing, hover);
     machine.clickMenu(4);
     count("pointer over the score view", nothing, hover);

@@ -11,7 +11,9 @@
 #include <string>
 #include <vector>
 
+#include "../../tests/support/files.hpp"
 #include "app/program.hpp"
+#include "hosts/headless/memory_blob.hpp"
 #include "hosts/headless/scripted_user.hpp"
 
 namespace quabble {
@@ -35,8 +37,9 @@ bool writePicture(const std::string& file, const Surface& picture) {
 class Photographer {
  public:
     Photographer(const std::string& programFolder, std::string pictureFolder, std::uint64_t seed)
-        : pictureFolder_(std::move(pictureFolder)), frontEnd_(programFolder), app_(loop_, registry_, seed) {
-        frontEnd_.connect(loop_);
+        : pictureFolder_(std::move(pictureFolder)),
+          frontEnd_(picturesIn(programFolder)),
+          program_(frontEnd_, registry_, seed) {
         program_.start();
         user_.wait(3s);  // the splash has gone
     }
@@ -133,11 +136,11 @@ class Photographer {
 
     std::string pictureFolder_;
     HeadlessFrontEnd frontEnd_;
-    MessageLoop loop_{frontEnd_};
-    Registry registry_ = Registry::inMemory();
-    AppState app_;
-    ScriptedUser user_{frontEnd_, loop_};
-    Task<> program_ = runProgram(app_);
+    MemoryBlob kept_;
+    BlobRegistryStore registry_{kept_};
+    Program program_;
+    ScriptedUser<Program> user_{frontEnd_, program_};
+    AppState& app_ = program_.state();
 };
 
 bool takeAll(const std::string& programFolder, const std::string& pictureFolder,

@@ -3,29 +3,31 @@
 #include "app/app_state.hpp"
 #include "base/round_half_even.hpp"
 
-namespace quabble {
+namespace quabble::layout {
 namespace {
 
 constexpr std::int32_t buttonHeight = 30;
-constexpr std::size_t mainMenuButtons = 8;
+constexpr std::int32_t mainMenuButtons = 8;
 constexpr std::int32_t cellSize = 28;
+constexpr Size playPanelSize{400, 500};
+constexpr std::int32_t playPanelLeft = 200;
 
-ScreenButton panelEntry(Canvas& canvas, std::size_t i) {
-    return {.surface = &canvas,
-            .left = 25,
-            .top = 90 + 40 * static_cast<std::int32_t>(i),
-            .width = 140,
+ScreenButton button(std::int32_t left, std::int32_t top, std::int32_t width) {
+    return {.left = left,
+            .top = top,
+            .width = width,
             .height = buttonHeight,
             .fillBrush = palette::backgroundBrush,
             .framePen = palette::lightPen,
-            .textColour = palette::panelTextColour};
+            .textColour = palette::panelTextColour,
+            .font = captionFont};
 }
 
 // A panel of `size` entries: a title, `values` pairs of a label and a value box, and buttons.
-ButtonSet layOutPanel(Canvas& canvas, std::size_t size, std::size_t values) {
-    ButtonSet entries;
-    for (std::size_t i = 0; i < size; ++i)
-        entries.push_back(panelEntry(canvas, i));
+std::vector<ScreenButton> panel(std::int32_t size, std::size_t values) {
+    std::vector<ScreenButton> entries;
+    for (std::int32_t i = 0; i < size; ++i)
+        entries.push_back(button(25, 90 + 40 * i, 140));
     entries[0].top = 50;
     entries[0].active = BoxKind::Label;
     for (std::size_t i = 1; i <= 2 * values; i += 2) {
@@ -38,72 +40,52 @@ ButtonSet layOutPanel(Canvas& canvas, std::size_t size, std::size_t values) {
     return entries;
 }
 
-}  // namespace
-
-ScreenButton layOutBackground(Canvas& canvas) {
-    return {.surface = &canvas,
-            .width = layoutUnit * 15,
-            .height = roundHalfEven(layoutUnit * 12.5),
-            .fillBrush = palette::backgroundBrush};
+Rect playPanel(std::int32_t top) {
+    return Rect::ofSize(playPanelLeft, top, playPanelSize.width, playPanelSize.height);
 }
 
-ButtonSet initMMBtns(Canvas& canvas, const ScreenButton& background) {
-    ButtonSet buttons;
-    for (std::size_t i = 1; i <= mainMenuButtons; ++i) {
-        buttons.push_back({.surface = &canvas,
-                           .left = roundHalfEven(background.width / 2.0 - layoutUnit * 2.5),
-                           .top = roundHalfEven(30.0 * static_cast<double>(i) * 1.75),
-                           .width = layoutUnit * 5,
-                           .height = buttonHeight,
-                           .fillBrush = palette::backgroundBrush,
-                           .framePen = palette::lightPen,
-                           .textColour = palette::panelTextColour});
-    }
+}  // namespace
+
+Size clientSize() {
+    return {layoutUnit * 15, roundHalfEven(layoutUnit * 12.5)};
+}
+
+std::vector<ScreenButton> initMMBtns() {
+    const std::int32_t left = roundHalfEven(clientSize().width / 2.0 - layoutUnit * 2.5);
+    std::vector<ScreenButton> buttons;
+    for (std::int32_t i = 1; i <= mainMenuButtons; ++i)
+        buttons.push_back(button(left, roundHalfEven(30.0 * i * 1.75), layoutUnit * 5));
     return buttons;
 }
 
-ButtonSet initStandardBtns(Canvas& canvas) {
-    return layOutPanel(canvas, 8, 2);
+std::vector<ScreenButton> initStandardBtns() {
+    return panel(8, 2);
 }
 
-ButtonSet initArcadeBtns(Canvas& canvas) {
-    return layOutPanel(canvas, 10, 3);
+std::vector<ScreenButton> initArcadeBtns() {
+    return panel(10, 3);
 }
 
-ScreenButton layOutPlayPanel(Canvas& canvas, const ScreenButton& background) {
-    return {.surface = &canvas,
-            .left = roundHalfEven((background.width - 400) / 2.0),
-            .top = roundHalfEven((background.height - 540) / 2.0),
-            .width = 400,
-            .height = 500};
+Rect classicPlayPanel() {
+    return playPanel(roundHalfEven((clientSize().height - 540) / 2.0));
 }
 
-ScreenButton layOutBoard(Canvas& canvas, const ScreenButton& playPanel) {
-    constexpr std::int32_t width = 12 * cellSize;
-    constexpr std::int32_t height = 16 * cellSize;
-    return {.surface = &canvas,
-            .left = roundHalfEven((playPanel.width - width) / 2.0 + playPanel.left),
-            .top = roundHalfEven((playPanel.height - height) / 2.0 + playPanel.top),
-            .width = width,
-            .height = height,
-            .cellSize = cellSize};
+Rect arcadePlayPanel() {
+    return playPanel(5);
 }
 
-ScreenButton layOutPreview(Canvas& canvas, const ScreenButton& board) {
-    return {.surface = &canvas,
-            .left = board.left,
-            .top = board.top + board.height + 25,
-            .width = board.width,
-            .height = cellSize,
-            .cellSize = cellSize};
+CellBox board(const Rect& playPanel) {
+    return {roundHalfEven((playPanel.width() - 12 * cellSize) / 2.0 + playPanel.left),
+            roundHalfEven((playPanel.height() - 16 * cellSize) / 2.0 + playPanel.top), cellSize};
 }
 
-ScreenButton layOutGauge(Canvas& canvas, const ScreenButton& playPanel, const ScreenButton& board) {
-    return {.surface = &canvas,
-            .left = layoutUnit + board.left + board.width,
-            .top = roundHalfEven((playPanel.height - 240) / 2.0 + playPanel.top),
-            .width = 30,
-            .height = 240};
+CellBox preview(const CellBox& board) {
+    return {board.left, board.cell(0, 16).top + 25, cellSize};
 }
 
-}  // namespace quabble
+Rect gauge(const Rect& playPanel, const CellBox& board) {
+    return Rect::ofSize(layoutUnit + board.cell(12, 0).left,
+                        roundHalfEven((playPanel.height() - 240) / 2.0 + playPanel.top), 30, 240);
+}
+
+}  // namespace quabble::layout

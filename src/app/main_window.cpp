@@ -1,79 +1,72 @@
 #include "app/main_window.hpp"
 
-#include <algorithm>
-#include <optional>
-
-#include "app/app_state.hpp"
+#include "app/layout.hpp"
+#include "app/store_message.hpp"
 #include "base/round_half_even.hpp"
-#include "gfx/painters.hpp"
 #include "gfx/string_table.hpp"
+#include "store/version.hpp"
 
 namespace quabble {
 namespace {
 
-constexpr std::int32_t twipsPerPixel = 15;  // a twip is 1/1440 inch
+// What the buttons of the main menu do, from the top down.
+enum class MenuButton {
+    Training,
+    Timed,
+    Strategy,
+    TrainingScores,
+    TimedScores,
+    StrategyScores,
+    Instructions,
+    Exit
+};
 
-// The first box that the point hits, of those that are buttons.
-std::optional<std::size_t> buttonAt(const ButtonSet& boxes, float x, float y) {
-    const auto hit = std::ranges::find_if(
-        boxes, [&](const ScreenButton& box) { return box.active == BoxKind::Button && hitTest(box, x, y); });
-    if (hit == boxes.end())
-        return std::nullopt;
-    return static_cast<std::size_t>(hit - boxes.begin()) + 1;
-}
+constexpr std::int32_t menuShadow = 3;
 
 }  // namespace
 
-MainWindow::MainWindow(AppState& app)
-    : Window(app.loop),
+MainWindow::MainWindow(MessageLoop& loop, AppState& app)
+    : Window(loop),
       app_(app),
-      game_(app.game, app.highScores, app.levelTable, app.random, *this),
-      timerBlocks_(app.loop, [this] { return timerBlocks_Timer(); }) {
+      mmBtns_(layout::initMMBtns(), string_ids::mainMenuBase, menuShadow),
+      screen_(loop, *this, app,
+              {.showMainMenu = [this] { showMainMenu(); },
+               .blockTimerTick = [this] { return game_.blockTimerTick(); }}),
+      game_(app.game, app.highScores, app.levelTable, app.random, screen_),
+      lblPause_([this] { return lblPause_Click(); }) {
     lblPause_.caption = "Game Paused Click here to continue";
     lblPause_.font = {Typeface::SansNarrowBold, 18};
     lblPause_.textColour = palette::pauseTextColour;
     lblPause_.background = palette::pauseBackground;
-    lblPause_.onClick = [this] { return lblPause_Click(); };
     addControl(lblPause_);
 }
 
 void MainWindow::Form_Load() {
-    const std::int32_t myHt = roundHalfEven(layoutUnit * 12.5 * twipsPerPixel);
-    const std::int32_t myWid = layoutUnit * 15 * twipsPerPixel;
-    setClientSize({myWid / twipsPerPixel, myHt / twipsPerPixel});
-    setPosition({(app_.loop.frontEnd().screenSize().width - clientSize().width) / 2, 0});
+    setClientSize(layout::clientSize());
+    setPosition({(loop().frontEnd().screenSize().width - clientSize().width) / 2, 0});
     setCaption(std::string(applicationTitle) + "  Ver " + versionText());
-    canvas().font.face = Typeface::SansBold;
-    backgroundBox_ = layOutBackground(canvas());
-    fillBox(backgroundBox_);
-    mmBtns_ = initMMBtns(canvas(), backgroundBox_);
-    playPanelBox_ = layOutPlayPanel(canvas(), backgroundBox_);
+    lblPause_.area = canvas().bounds();
     app_.game.mainMenuActive = true;
-    standardBtns_ = initStandardBtns(canvas());
-    arcadeBtns_ = initArcadeBtns(canvas());
     app_.game.grid.recreate(12, 15);
+    screen_.clearWindow();
 }
 
 // The settings are saved while the window is still there for a message to stand in front of.
 Task<> MainWindow::Form_QueryUnload() {
     if (app_.save() == StoreResult::NotOpened) {
-        timerBlocks_.setEnabled(false);
-        co_await app_.tellStoreError(this);
+        screen_.switchBlockTimer(false);
+        co_await showStoreMessage(loop(), this);
     }
     unload();
 }
 
 void MainWindow::Form_Unload() {
-    app_.loop.end();
-}
-
-bool MainWindow::Form_Terminate() {
-    return app_.save() == StoreResult::Done;
+    loop().end();
 }
 
 // The window's size is fixed. Minimising it by its frame hides a running game as a key does.
 void MainWindow::Form_Resize() {
-    if (state() == State::Minimised && app_.game.isGameActive() && !gamePaused_)
+    if (state() == State::Minimised && app_.game.isGameActive() && !isPaused())
         enablePause(true);
 }
 
@@ -81,64 +74,114 @@ int MainWindow::screen() const {
     enum { Menu, Game, PausedGame };
     if (app_.game.mainMenuActive)
         return Menu;
-    return gamePaused_ ? PausedGame : Game;
+    return isPaused() ? PausedGame : Game;
 }
 
 bool MainWindow::isClickable(float x, float y) const {
     if (app_.game.mainMenuActive)
-        return buttonAt(mmBtns_, x, y).has_value();
-    if (app_.game.classicActive)
-        return buttonAt(standardBtns_, x, y).has_value();
-    return app_.game.arcadeActive && (buttonAt(arcadeBtns_, x, y) || hitTest(previewBox_, x, y));
+        return mmBtns_.buttonAt(x, y).has_value();
+    return app_.game.isGameActive() && (screen_.buttonAt(x, y) || screen_.isOnPreview(x, y));
 }
 
 Task<> MainWindow::Form_MouseDown(float x, float y) {
-    if (gamePaused_) {
+    if (isPaused())
         enablePause(false);
-    } else if (app_.game.mainMenuActive) {
-        if (const auto button = buttonAt(mmBtns_, x, y))
-            co_await mainMenuClick(*button);
-    } else if (app_.game.classicActive) {
-        if (const auto button = buttonAt(standardBtns_, x, y))
-            co_await standardMenuClick(*button);
-        else
-            co_await clickBoard(x, y);
-    } else if (app_.game.arcadeActive) {
-        if (const auto button = buttonAt(arcadeBtns_, x, y)) {
-            co_await arcadeMenuClick(*button);
-            co_return;
-        }
-        if (hitTest(previewBox_, x, y))
-            co_await game_.putnextRow();
-        co_await clickBoard(x, y);
-    }
-}
-
-Task<> MainWindow::clickBoard(float x, float y) {
-    return game_.gameBoardClick(static_cast<std::int16_t>(roundHalfEven(x)),
-                                static_cast<std::int16_t>(roundHalfEven(y)));
+    else if (app_.game.mainMenuActive)
+        co_await mainMenuClick(x, y);
+    else if (app_.game.isGameActive())
+        co_await gameClick(x, y);
 }
 
 Task<> MainWindow::Form_MouseMove(float x, float y) {
-    if (gamePaused_)
-        co_return;
-    if (app_.game.mainMenuActive)
-        highlightUnderPointer(mmBtns_, string_ids::mainMenuBase, x, y);
-    else if (app_.game.classicActive)
-        highlightUnderPointer(standardBtns_, string_ids::classicPanelBase, x, y);
-    else if (app_.game.arcadeActive)
-        highlightUnderPointer(arcadeBtns_, string_ids::arcadePanelBase, x, y);
+    if (app_.game.isGameActive() && !isPaused())
+        screen_.highlightUnderPointer(x, y);
+    while (app_.game.mainMenuActive && mmBtns_.highlightNext(canvas(), x, y))
+        refresh();
+    co_return;
 }
 
 // Any key hides the window at once and leaves a running game paused.
 Task<> MainWindow::Form_KeyPress(std::int16_t) {
     if (app_.game.mainMenuActive) {
         minimise();
-    } else if (state() == State::Normal && !gamePaused_) {
+    } else if (state() == State::Normal && !isPaused()) {
         enablePause(true);
         minimise();
     }
     co_return;
+}
+
+void MainWindow::showMainMenu() {
+    screen_.setPaused(false);
+    lblPause_.visible = false;
+    app_.game.mainMenuActive = true;
+    screen_.clearWindow();
+    mmBtns_.draw(canvas());
+    refresh();
+}
+
+Task<> MainWindow::mainMenuClick(float x, float y) {
+    const auto button = mmBtns_.buttonAt(x, y);
+    if (!button)
+        co_return;
+    const auto choose = [this](GameMode mode) {
+        app_.game.gameMode = mode;
+        app_.game.scoreTableIndex = static_cast<std::int16_t>(mode);
+    };
+    switch (static_cast<MenuButton>(*button)) {
+        case MenuButton::Training:
+            choose(GameMode::Training);
+            game_.startStandardGame();
+            break;
+        case MenuButton::Timed:
+            choose(GameMode::Timed);
+            co_await game_.startArcadeGame();
+            break;
+        case MenuButton::Strategy:
+            choose(GameMode::Strategy);
+            co_await game_.startArcadeGame();
+            break;
+        case MenuButton::TrainingScores:
+            co_await screen_.showHighScores(static_cast<std::int16_t>(GameMode::Training));
+            break;
+        case MenuButton::TimedScores:
+            co_await screen_.showHighScores(static_cast<std::int16_t>(GameMode::Timed));
+            break;
+        case MenuButton::StrategyScores:
+            co_await screen_.showHighScores(static_cast<std::int16_t>(GameMode::Strategy));
+            break;
+        case MenuButton::Instructions:
+            openHelp();
+            break;
+        case MenuButton::Exit:
+            co_await Form_QueryUnload();
+            break;
+    }
+}
+
+Task<> MainWindow::gameClick(float x, float y) {
+    if (const auto button = screen_.buttonAt(x, y)) {
+        co_await gameMenuClick(*button);
+        co_return;
+    }
+    if (screen_.isOnPreview(x, y))
+        co_await game_.putnextRow();
+    co_await game_.gameBoardClick(static_cast<std::int16_t>(roundHalfEven(x)),
+                                  static_cast<std::int16_t>(roundHalfEven(y)));
+}
+
+Task<> MainWindow::gameMenuClick(PanelButton button) {
+    switch (button) {
+        case PanelButton::Pause:
+            enablePause(true);
+            break;
+        case PanelButton::Help:
+            openHelp();
+            break;
+        case PanelButton::EndGame:
+            co_await game_.endGame();
+            break;
+    }
 }
 
 Task<> MainWindow::lblPause_Click() {
@@ -146,14 +189,12 @@ Task<> MainWindow::lblPause_Click() {
     co_return;
 }
 
-Task<> MainWindow::timerBlocks_Timer() {
-    return game_.blockTimerTick();
+void MainWindow::openHelp() {
+    loop().frontEnd().openDocument("QB_HELP.HTM");
 }
 
 void MainWindow::enablePause(bool enab) {
-    gamePaused_ = enab;
-    switchBlockTimer(!enab && app_.game.arcadeActive && app_.game.gameMode == GameMode::Timed);
-    lblPause_.area = Rect::ofSize(0, 0, clientSize().width, clientSize().height);
+    screen_.setPaused(enab);
     lblPause_.visible = enab;
     refresh();
 }

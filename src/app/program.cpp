@@ -1,38 +1,44 @@
 #include "app/program.hpp"
 
-#include <filesystem>
-
 #include "app/splash.hpp"
+#include "app/store_message.hpp"
 
 namespace quabble {
-namespace {
 
-constexpr char folderSeparator = static_cast<char>(std::filesystem::path::preferred_separator);
+Program::Program(FrontEnd& frontEnd, RegistryStore& registry, std::uint64_t seed)
+    : loop_(frontEnd), state_(registry, seed), task_(run()) {}
 
-std::string withSeparator(std::string folder) {
-    if (folder.empty() || folder.back() != folderSeparator)
-        folder += folderSeparator;
-    return folder;
+Task<> Program::run() {
+    co_await Main();
+    co_await loop_.run();
 }
 
-Task<> Main(AppState& app) {
-    app.programFolder = withSeparator(app.loop.frontEnd().executableFolder());
-    if (app.load() == StoreResult::NotOpened)
-        co_await app.tellStoreError(nullptr);
-    app.pictures = loadGraphics(app.programFolder);
-    Splash splash(app);
-    co_await app.loop.showModal(splash);
-    app.pictures.backdrop = {};  // only the splash shows it
-    app.settings.solvingData.setSplashSeen();
-    app.frmQuabble().show();
-    app.frmQuabble().showMainMenu();
+Task<> Program::Main() {
+    if (state_.load() == StoreResult::NotOpened)
+        co_await showStoreMessage(loop_, nullptr);
+    state_.pictures = loadGraphics(loop_.frontEnd());
+    Splash diagSWS(loop_, state_.pictures.backdrop);
+    co_await loop_.showModal(diagSWS);
+    state_.pictures.backdrop = {};  // only the splash shows it
+    state_.settings.solvingData.setSplashSeen();
+    frmQuabble_.emplace(loop_, state_).show();
+    frmQuabble_->showMainMenu();
 }
 
-}  // namespace
+std::optional<WindowId> Program::modalWindow() const {
+    const Window* window = loop_.modalWindow();
+    return window == nullptr ? std::nullopt : std::optional(window->id());
+}
 
-Task<> runProgram(AppState& app) {
-    co_await Main(app);
-    co_await app.loop.run();
+// Before the main window is there nothing has changed.
+bool Program::keep() {
+    return !frmQuabble_ || !frmQuabble_->isShown() || state_.save() == StoreResult::Done;
+}
+
+bool Program::requestEnd() {
+    const bool isKept = keep();
+    loop_.end();
+    return isKept;
 }
 
 }  // namespace quabble

@@ -2,9 +2,9 @@
 
 #include <string>
 
-#include "app/app_state.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/string_table.hpp"
+#include "store/version.hpp"
 
 namespace quabble {
 namespace {
@@ -16,27 +16,23 @@ constexpr Colour taglineColour{200, 200, 250};
 
 }  // namespace
 
-Splash::Splash(AppState& app)
-    : Window(app.loop), app_(app), splashTimer_(app.loop, [this] { return splashTimer_Timer(); }) {}
+Splash::Splash(MessageLoop& loop, const Surface& backdrop)
+    : Window(loop), backdrop_(backdrop), splashTimer_(loop, [this] { return splashTimer_Timer(); }) {}
 
 void Splash::Form_Load() {
     setCaption(std::string(applicationTitle));
     setBorderless();
     setClientSize(splashSize);
-    const ScreenButton background{
-        .surface = &canvas(), .width = splashSize.width, .height = splashSize.height};
-    copyPicture(background, app_.pictures.backdrop);
-    taglineBox_ = {.surface = &canvas(),
-                   .left = 350,
-                   .top = 400,
-                   .width = 200,
-                   .height = 40,
-                   .textColour = taglineColour};
+    copyPicture(canvas(), canvas().bounds(), backdrop_);
+    tagline_ = {.left = 350,
+                .top = 400,
+                .width = 200,
+                .height = 40,
+                .textColour = taglineColour,
+                .font = {Typeface::SansBold, 9, true}};
+    drawShadowText(canvas(), tagline_, 2, loadString(string_ids::tagline), defaultTextFormat);
     splashTimer_.setInterval(1000ms);
     splashTimer_.setEnabled(true);
-    canvas().font = {Typeface::SansBold, 9, true};
-    drawShadowText(taglineBox_, 2, loadString(string_ids::tagline), defaultTextFormat);
-    canvas().font.underlined = false;
     ticksLeft_ = 2;
 }
 
@@ -49,8 +45,8 @@ Task<> Splash::splashTimer_Timer() {
 }
 
 Task<> Splash::Form_MouseDown(float x, float y) {
-    if (hitTest(taglineBox_, x, y))
-        app_.openDocument(std::string(loadString(string_ids::webAddress)));
+    if (hitTest(tagline_, x, y))
+        loop().frontEnd().openDocument(loadString(string_ids::webAddress));
     co_return;
 }
 

@@ -8,23 +8,22 @@
 
 namespace quabble {
 
-class AppState;
-
 // The first window of a run: the backdrop with a link to the maker's page. It closes by itself after two
 // ticks of a second.
 class Splash final : public Window {
  public:
-    explicit Splash(AppState& app);
+    // The loop and the backdrop must outlive the splash.
+    Splash(MessageLoop& loop, const Surface& backdrop);
 
  private:
     void Form_Load() override;
-    bool isClickable(float x, float y) const override { return hitTest(taglineBox_, x, y); }
+    bool isClickable(float x, float y) const override { return hitTest(tagline_, x, y); }
     Task<> Form_MouseDown(float x, float y) override;
     Task<> splashTimer_Timer();
 
-    AppState& app_;
+    const Surface& backdrop_;
     Timer splashTimer_;
-    ScreenButton taglineBox_;
+    ScreenButton tagline_;
     std::int16_t ticksLeft_ = 0;
 };
 

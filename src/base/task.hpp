@@ -6,8 +6,6 @@
 #include <optional>
 #include <utility>
 
-#include "base/reused_memory.hpp"
-
 namespace quabble {
 
 template <typename T>
@@ -18,9 +16,6 @@ namespace detail {
 // What every task's promise has: who waits for it, and whether that waiter is still on the stack below it.
 class TaskPromiseBase {
  public:
-    static void* operator new(std::size_t size) { return reusedMemory().allocate(size); }
-    static void operator delete(void* frame, std::size_t size) { reusedMemory().deallocate(frame, size); }
-
     std::suspend_always initial_suspend() noexcept { return {}; }
 
     // Resumes the waiter, unless the waiter is the very call that is running this task: it then goes on by

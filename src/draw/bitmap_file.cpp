@@ -1,10 +1,6 @@
 #include "draw/bitmap_file.hpp"
 
 #include <cstdint>
-#include <filesystem>
-#include <fstream>
-#include <iterator>
-#include <vector>
 
 namespace quabble {
 namespace {
@@ -12,7 +8,6 @@ namespace {
 constexpr std::size_t fileHeaderSize = 14;
 constexpr std::size_t smallestInfoHeader = 40;
 constexpr std::int32_t largestEdge = 4096;
-constexpr std::uintmax_t largestFile = 64 << 20;
 
 // Reads little-endian numbers; the caller has checked that they lie within the bytes.
 std::uint32_t read32(std::span<const std::byte> bytes, std::size_t at) {
@@ -74,21 +69,6 @@ std::optional<Surface> decodeBitmap(std::span<const std::byte> file) {
         }
     }
     return picture;
-}
-
-std::optional<Surface> loadBitmap(const std::string& path) {
-    std::error_code unknown;
-    if (!std::filesystem::is_regular_file(path, unknown))
-        return std::nullopt;
-    std::ifstream stream(path, std::ios::binary | std::ios::ate);
-    const std::streamoff size = stream ? static_cast<std::streamoff>(stream.tellg()) : -1;
-    if (size < 0 || static_cast<std::uintmax_t>(size) > largestFile)
-        return std::nullopt;
-    std::vector<char> bytes(static_cast<std::size_t>(size));
-    stream.seekg(0);
-    if (!stream.read(bytes.data(), size))
-        return std::nullopt;
-    return decodeBitmap(std::as_bytes(std::span(bytes)));
 }
 
 }  // namespace quabble

@@ -3,7 +3,6 @@
 #include <cstddef>
 #include <optional>
 #include <span>
-#include <string>
 
 #include "draw/surface.hpp"
 
@@ -12,8 +11,5 @@ namespace quabble {
 // Decodes a 24-bit uncompressed BMP picture of at most 4096 x 4096 pixels. Nothing when the bytes are
 // anything else, or fewer than the header promises: a picture that was cut off is refused, not filled up.
 std::optional<Surface> decodeBitmap(std::span<const std::byte> file);
-
-// Reads and decodes a picture file. Nothing when it cannot be read or decoded.
-std::optional<Surface> loadBitmap(const std::string& path);
 
 }  // namespace quabble

@@ -24,17 +24,16 @@ void MessageDialog::Form_Load() {
     const std::int32_t buttonTop = 2 * margin + lineHeight;
     setCaption(title_);
     setClientSize({width, buttonTop + okButtonSize.height + margin});
-    canvas().picture.fill(canvas().picture.bounds(), palette::backgroundColour);
-    canvas().font = messageFont;
-    const ScreenButton label{.surface = &canvas(),
-                             .left = margin,
+    canvas().fill(canvas().bounds(), palette::backgroundColour);
+    const ScreenButton label{.left = margin,
                              .top = margin,
                              .width = width - 2 * margin,
                              .height = lineHeight,
-                             .textColour = palette::valueColour};
-    drawShadowText(label, 1, text_, text_format::centre);
-    okBox_ = layOutOkButton(canvas(), (width - okButtonSize.width) / 2, buttonTop);
-    drawOkButton(okBox_);
+                             .textColour = palette::valueColour,
+                             .font = messageFont};
+    drawShadowText(canvas(), label, 1, text_, text_format::centre);
+    okBox_ = layOutOkButton((width - okButtonSize.width) / 2, buttonTop);
+    drawOkButton(canvas(), okBox_);
 }
 
 }  // namespace quabble

@@ -5,21 +5,21 @@
 
 namespace quabble {
 
-ScreenButton layOutOkButton(Canvas& canvas, std::int32_t left, std::int32_t top) {
-    return {.surface = &canvas,
-            .left = left,
+ScreenButton layOutOkButton(std::int32_t left, std::int32_t top) {
+    return {.left = left,
             .top = top,
             .width = okButtonSize.width,
             .height = okButtonSize.height,
             .fillBrush = palette::backgroundBrush,
             .framePen = palette::outlinePen,
-            .textColour = palette::panelTextColour};
+            .textColour = palette::panelTextColour,
+            .font = {Typeface::Sans, 14}};
 }
 
-void drawOkButton(const ScreenButton& button) {
-    button.surface->font = {Typeface::Sans, 14};
+void drawOkButton(Canvas& canvas, const ScreenButton& button) {
     const BoxStyle style = button.hovered ? BoxStyle::DoubleFramed : BoxStyle::Framed;
-    drawLabelledBox(button, style, button.hovered, button.hovered ? 8 : 6, loadString(string_ids::ok));
+    drawLabelledBox(canvas, button, style, button.hovered, button.hovered ? 8 : 6,
+                    loadString(string_ids::ok));
 }
 
 }  // namespace quabble

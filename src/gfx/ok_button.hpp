@@ -1,5 +1,6 @@
 #pragma once
 
+#include "draw/canvas.hpp"
 #include "gfx/screen_button.hpp"
 
 namespace quabble {
@@ -7,9 +8,9 @@ namespace quabble {
 // The OK button that the dialogs have in common. It is drawn on the dialog's canvas; a dialog that takes the
 // keyboard lays a PushButton over it.
 constexpr Size okButtonSize{90, 30};
-ScreenButton layOutOkButton(Canvas& canvas, std::int32_t left, std::int32_t top);
+ScreenButton layOutOkButton(std::int32_t left, std::int32_t top);
 
 // Draws it, highlighted when it is hovered.
-void drawOkButton(const ScreenButton& button);
+void drawOkButton(Canvas& canvas, const ScreenButton& button);
 
 }  // namespace quabble

@@ -15,7 +15,7 @@ Task<> OkDialog::Form_MouseMove(float x, float y) {
     if (over == okBox_.hovered)
         co_return;
     okBox_.hovered = over;
-    drawOkButton(okBox_);
+    drawOkButton(canvas(), okBox_);
     refresh();
 }
 

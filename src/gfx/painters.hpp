@@ -3,50 +3,51 @@
 #include <cstdint>
 #include <string_view>
 
+#include "draw/canvas.hpp"
 #include "engine/grid_cell.hpp"
 #include "engine/play_grid.hpp"
 #include "gfx/screen_button.hpp"
 
 namespace quabble {
 
-// The painters draw a box on its surface, where it stays unseen until the window is refreshed. Texts are
-// written in the surface's current font, every one twice: a black copy and, up and to the right of it, one in
-// the box's colour.
+// The painters draw on a window's canvas, where it stays unseen until the window is refreshed. Every text is
+// written twice: a black copy and, up and to the right of it, one in the box's colour.
 
 enum class BoxStyle { Plain, Framed, DoubleFramed };
 
 // Fills the box; one without a brush is left as it is.
-void fillBox(const ScreenButton& box);
+void fillBox(Canvas& canvas, const ScreenButton& box);
 
 // Draws the box with its caption in the middle. The front copy is written in the rectangle whose right edge
 // is moved right and whose bottom edge is moved up by `shadowOffset` pixels, so it lies half as far from the
 // black one. Each copy is clipped to its own rectangle.
-void drawLabelledBox(const ScreenButton& box, BoxStyle style, bool highlighted, std::int32_t shadowOffset,
-                     std::string_view caption);
+void drawLabelledBox(Canvas& canvas, const ScreenButton& box, BoxStyle style, bool highlighted,
+                     std::int32_t shadowOffset, std::string_view caption);
 
 constexpr std::int32_t defaultTextFormat = -1;  // at the top left
 
 // Writes a text of one or more lines. The front copy is written in the rectangle whose left edge is moved
 // right and whose top edge is moved up by `offset` pixels. The format is drawText's, or the default.
-void drawShadowText(const ScreenButton& box, std::int32_t offset, std::string_view text, std::int32_t format);
+void drawShadowText(Canvas& canvas, const ScreenButton& box, std::int32_t offset, std::string_view text,
+                    std::int32_t format);
 
 // The painters below copy from a picture.
 
 // Copies a tile to the cell at (column, row), counted from 0.
-void drawCell(const ScreenButton& box, const Surface& spriteSheet, std::int16_t column, std::int16_t row,
-              std::int16_t tile);
-void drawBoard(const ScreenButton& box, const Surface& spriteSheet, const PlayGrid& grid);
+void drawCell(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, std::int16_t column,
+              std::int16_t row, std::int16_t tile);
+void drawBoard(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, const PlayGrid& grid);
 
 // Draws the waiting row; its last `revealed` + 1 cells show plainly, the others darkened.
-void drawPreviewRow(const ScreenButton& box, const Surface& spriteSheet, const GridRow& nextRow,
+void drawPreviewRow(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, const GridRow& nextRow,
                     std::int16_t revealed);
 
-// Draws how far a level has come, 0 to 100 percent, from the top down. It is 241 rows high whatever the box.
-void drawGauge(const ScreenButton& box, const Surface& spriteSheet, double percentage);
+// Draws how far a level has come, 0 to 100 percent, from the top down. It is 241 rows high whatever the area.
+void drawGauge(Canvas& canvas, const Rect& area, const Surface& spriteSheet, double percentage);
 
-void drawPlayPanel(const ScreenButton& box, const Surface& spriteSheet);
+void drawPlayPanel(Canvas& canvas, const Rect& area, const Surface& spriteSheet);
 
-// Copies a picture's top-left part to the box.
-void copyPicture(const ScreenButton& box, const Surface& picture);
+// Copies a picture's top-left part to the area.
+void copyPicture(Canvas& canvas, const Rect& area, const Surface& picture);
 
 }  // namespace quabble

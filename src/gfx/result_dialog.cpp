@@ -45,23 +45,21 @@ void ResultDialog::Form_Load() {
     setCaption("Game Statistics");
     setClientSize(designedSize);
     layOut();
-    fillBox(frameBox_);
-    canvas().font = textFont;
-    drawShadowText(statsBox_, 2, resultText(game_, goNextLevel), text_format::centre);
-    drawOkButton(okBox_);
+    canvas().fill(canvas().bounds(), palette::blackBrush.colour);
+    drawShadowText(canvas(), statsBox_, 2, resultText(game_, goNextLevel), text_format::centre);
+    drawOkButton(canvas(), okBox_);
 }
 
 void ResultDialog::layOut() {
     const std::int32_t u = layoutUnit_;
     const auto [width, height] = outerSize();
-    frameBox_ = {.surface = &canvas(), .width = width, .height = height, .fillBrush = palette::blackBrush};
-    statsBox_ = {.surface = &canvas(),
-                 .left = u,
+    statsBox_ = {.left = u,
                  .top = u,
                  .width = width - 2 * u,
                  .height = height - 4 * u,
-                 .textColour = palette::panelTextColour};
-    okBox_ = layOutOkButton(canvas(), roundHalfEven((width - okButtonSize.width) / 2.0), height - 2 * u);
+                 .textColour = palette::panelTextColour,
+                 .font = textFont};
+    okBox_ = layOutOkButton(roundHalfEven((width - okButtonSize.width) / 2.0), height - 2 * u);
 }
 
 }  // namespace quabble

@@ -27,7 +27,6 @@ class ResultDialog final : public OkDialog {
 
     const GameState& game_;
     std::int16_t layoutUnit_;
-    ScreenButton frameBox_;
     ScreenButton statsBox_;
 };
 

@@ -3,8 +3,8 @@
 #include <cstdint>
 #include <optional>
 
-#include "draw/canvas.hpp"
 #include "draw/geometry.hpp"
+#include "draw/text.hpp"
 #include "gfx/palette.hpp"
 
 namespace quabble {
@@ -12,9 +12,8 @@ namespace quabble {
 // What a drawn box is for; the values are those of a button's `active` number.
 enum class BoxKind : std::int32_t { ValueBox = -1, Label = 0, Button = 1 };
 
-// A rectangle that is drawn on a window: a button, a label, a value box, the board or a whole background.
+// A box with a caption that is drawn on a window: a button, a label or a value box.
 struct ScreenButton {
-    Canvas* surface = nullptr;  // what it is drawn on; whoever lays the box out owns that
     std::int32_t left = 0;
     std::int32_t top = 0;
     std::int32_t width = 0;
@@ -23,13 +22,28 @@ struct ScreenButton {
     std::optional<Brush> fillBrush = std::nullopt;
     std::optional<Pen> framePen = std::nullopt;
     Colour textColour = {};
-    std::int32_t cellSize = 1;  // edge of one cell, for boxes that hold cells
+    Font font = {};
     BoxKind active = BoxKind::Button;
 
     Rect rect() const { return Rect::ofSize(left, top, width, height); }
 };
 
-// True when the point lies strictly inside the box: a point on any edge is outside.
-bool hitTest(const ScreenButton& box, float x, float y);
+// Square cells that tiles are drawn in: the board, or the strip of the waiting row.
+struct CellBox {
+    std::int32_t left = 0;
+    std::int32_t top = 0;
+    std::int32_t cellSize = 1;  // edge of one cell
+
+    // The cell at a place counted from 0.
+    Rect cell(std::int32_t column, std::int32_t row) const {
+        return Rect::ofSize(left + column * cellSize, top + row * cellSize, cellSize, cellSize);
+    }
+};
+
+// True when the point lies strictly inside the area: a point on any edge is outside.
+bool hitTest(const Rect& area, float x, float y);
+inline bool hitTest(const ScreenButton& box, float x, float y) {
+    return hitTest(box.rect(), x, y);
+}
 
 }  // namespace quabble

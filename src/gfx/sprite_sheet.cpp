@@ -59,11 +59,11 @@ Surface standInSheet() {
 
 }  // namespace
 
-Pictures loadGraphics(const std::string& programFolder) {
-    std::optional<Surface> sheet = loadBitmap(programFolder + "ALLPICDATA.BMP");
+Pictures loadGraphics(FrontEnd& frontEnd) {
+    std::optional<Surface> sheet = decodeBitmap(frontEnd.programFile("ALLPICDATA.BMP"));
     if (!sheet || sheet->width() < sprites::sheetSize.width || sheet->height() < sprites::sheetSize.height)
         sheet = standInSheet();
-    return {std::move(*sheet), loadBitmap(programFolder + "BGIMG.BMP").value_or(Surface{})};
+    return {std::move(*sheet), decodeBitmap(frontEnd.programFile("BGIMG.BMP")).value_or(Surface{})};
 }
 
 }  // namespace quabble

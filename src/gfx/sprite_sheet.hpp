@@ -1,10 +1,10 @@
 #pragma once
 
 #include <cstdint>
-#include <string>
 
 #include "draw/geometry.hpp"
 #include "draw/surface.hpp"
+#include "platform/front_end.hpp"
 
 namespace quabble {
 
@@ -32,8 +32,8 @@ struct Pictures {
     Surface backdrop;  // without pixels when there is none
 };
 
-// Loads the pictures from the program's folder, which ends in a separator. When the sprite sheet is missing,
-// damaged or too small, plain coloured tiles with their numbers stand in for it.
-Pictures loadGraphics(const std::string& programFolder);
+// Loads the pictures from the program's files. When the sprite sheet is missing, damaged or too small, plain
+// coloured tiles with their numbers stand in for it.
+Pictures loadGraphics(FrontEnd& frontEnd);
 
 }  // namespace quabble

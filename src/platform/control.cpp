@@ -18,25 +18,25 @@ Task<> Control::keyPress(std::int16_t) {
     co_return;
 }
 
-void paintFocusRing(Surface& surface, const Rect& area) {
-    surface.outline(area.shrunkBy(-1), focusRing);
-    surface.outline(area.shrunkBy(-2), focusRing);
+void paintFocusRing(Canvas& canvas, const Rect& area) {
+    canvas.outline(area.shrunkBy(-1), focusRing);
+    canvas.outline(area.shrunkBy(-2), focusRing);
 }
 
-void paintControlEdge(Surface& surface, const Rect& area, bool hasFocus) {
-    surface.outline(area, edge);
+void paintControlEdge(Canvas& canvas, const Rect& area, bool hasFocus) {
+    canvas.outline(area, edge);
     if (hasFocus)
-        paintFocusRing(surface, area);
+        paintFocusRing(canvas, area);
 }
 
-void Label::paint(Surface& surface, bool) const {
-    surface.fill(area, background);
-    drawText(surface, area, caption, centredLine, textColour, font);
+void Label::paint(Canvas& canvas, bool) const {
+    canvas.fill(area, background);
+    canvas.write(area, caption, centredLine, font, textColour);
 }
 
-void PushButton::paint(Surface& surface, bool hasFocus) const {
+void PushButton::paint(Canvas& canvas, bool hasFocus) const {
     if (hasFocus)
-        paintFocusRing(surface, area);
+        paintFocusRing(canvas, area);
 }
 
 Task<> PushButton::mouseDown(Point, bool) {
@@ -45,7 +45,7 @@ Task<> PushButton::mouseDown(Point, bool) {
 
 Task<> PushButton::mouseUp(Point at) {
     if (area.contains(at.x, at.y))
-        co_await onClick();
+        co_await onClick_();
 }
 
 }  // namespace quabble

@@ -4,10 +4,10 @@
 #include <functional>
 #include <string>
 #include <string_view>
+#include <utility>
 
 #include "base/task.hpp"
-#include "draw/surface.hpp"
-#include "draw/text.hpp"
+#include "draw/canvas.hpp"
 #include "platform/input_event.hpp"
 
 namespace quabble {
@@ -22,7 +22,7 @@ class Control {
     bool visible = false;
     Rect area;
 
-    virtual void paint(Surface& surface, bool hasFocus) const = 0;
+    virtual void paint(Canvas& canvas, bool hasFocus) const = 0;
     virtual Task<> mouseDown(Point at, bool extends) = 0;
     // The pointer moved after a press on the control, and the button is still held.
     virtual void mouseDrag(Point /*at*/) {}
@@ -41,23 +41,30 @@ class Control {
 };
 
 // Paints the bright ring around the control that has the focus.
-void paintFocusRing(Surface& surface, const Rect& area);
+void paintFocusRing(Canvas& canvas, const Rect& area);
 // Paints the edge of a control that takes the keyboard and, while it has the focus, the ring.
-void paintControlEdge(Surface& surface, const Rect& area, bool hasFocus);
+void paintControlEdge(Canvas& canvas, const Rect& area, bool hasFocus);
 constexpr Colour controlInk{16, 22, 48};
 
-// A line of text in the middle of a plain area.
+// Makes the task of what a click does.
+using ClickHandler = std::function<Task<>()>;
+
+// A line of text in the middle of a plain area, which can be clicked.
 class Label final : public Control {
  public:
+    explicit Label(ClickHandler onClick) : onClick_(std::move(onClick)) {}
+
     std::string caption;  // Windows-1252
     Font font;
     Colour textColour;
     Colour background;
-    std::function<Task<>()> onClick;
 
-    void paint(Surface& surface, bool hasFocus) const override;
-    Task<> mouseDown(Point, bool) override { return onClick(); }
+    void paint(Canvas& canvas, bool hasFocus) const override;
+    Task<> mouseDown(Point, bool) override { return onClick_(); }
     bool isClickable() const override { return true; }
+
+ private:
+    ClickHandler onClick_;
 };
 
 // A button whose look is drawn on the window's picture; the control adds the ring of the focus.
@@ -65,15 +72,18 @@ class Label final : public Control {
 // presses it while it has the focus.
 class PushButton final : public Control {
  public:
-    std::function<Task<>()> onClick;
+    explicit PushButton(ClickHandler onClick) : onClick_(std::move(onClick)) {}
 
-    void paint(Surface& surface, bool hasFocus) const override;
+    void paint(Canvas& canvas, bool hasFocus) const override;
     Task<> mouseDown(Point at, bool extends) override;
     Task<> mouseUp(Point at) override;
     bool isClickable() const override { return true; }
     bool takesFocus() const override { return true; }
     bool takesKey(std::int16_t key) const override { return key == keys::space; }
-    Task<> keyPress(std::int16_t) override { return onClick(); }
+    Task<> keyPress(std::int16_t) override { return onClick_(); }
+
+ private:
+    ClickHandler onClick_;
 };
 
 }  // namespace quabble

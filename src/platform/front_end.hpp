@@ -1,10 +1,12 @@
 #pragma once
 
 #include <chrono>
+#include <cstddef>
 #include <cstdint>
 #include <optional>
-#include <span>
 #include <string>
+#include <string_view>
+#include <vector>
 
 #include "draw/geometry.hpp"
 #include "draw/surface.hpp"
@@ -20,50 +22,62 @@ enum class WindowId : std::uint32_t { none = 0 };
 // What a native window is made from. It never changes its size.
 struct NativeWindow {
     std::string caption;  // UTF-8
-    Size clientSize;      // what the program paints
-    std::optional<Point>
-        position;  // of its outer frame on the first screen; without one, centred on its owner or the screen
+    Size clientSize;      // what the program paints, in its pixels
+    // Of its outer frame, from the first screen's top left corner; without one it is centred on its owner or,
+    // if it has none, on the screen.
+    std::optional<Point> position;
     bool borderless = false;
-    WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner and centres on it
+    WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner, which is on the screen
 };
 
 enum class PointerShape { Arrow, Hand };
 
-// The machine that the program runs on, seen from the program: what a port has to write. Everything is called
-// on the one thread of the program. Operations with a body here may be left out by a machine that lacks them.
+// The machine that the program runs on, seen from the program: what a host has to write. Sizes and places are
+// in the program's pixels, however large the host shows them. Texts are UTF-8.
+//
+// The program calls it from inside `start`, `wake` and `requestEnd` of `Program`, and when it is destroyed;
+// all on one thread. An operation may post events, but must not wake the program, and must come back at once:
+// what takes time is reported by an event. Nothing is thrown. Operations with a body here may be left out.
 class FrontEnd {
  public:
     virtual ~FrontEnd() = default;
 
+    // The time, by a clock that never goes back. It need not go on while the machine sleeps.
     virtual TimePoint now() = 0;
 
-    // Makes a window. It comes to be seen with its first pixels.
+    // Makes a window under an id that was never used before. It comes to be seen with its first picture. If
+    // it cannot be made, an event for the id asks to close it, as if the user had.
     virtual void createWindow(WindowId window, const NativeWindow& traits) = 0;
+
+    // The operations below that name a window are called for those that were created and not closed yet.
+
     // Shows the picture, of the window's client size. When the window is uncovered or restored the front end
-    // shows it again by itself: it must stay where it is until the next one or until the window is closed.
+    // shows it again by itself: it stays where it is until the next one is shown or the window is closed.
     virtual void showPixels(WindowId window, const Surface& picture) = 0;
+    // The window goes from the screen, its owner is to take input again, and events that are still on their
+    // way to it may be posted or not.
     virtual void closeWindow(WindowId window) = 0;
-    // Asks for the window to be minimised; an event reports when it is.
+    // Asks for the window to be minimised. An event reports it once it is; one that cannot be stays as it is.
     virtual void minimiseWindow(WindowId /*window*/) {}
     // How the pointer looks over the window; at first it is an arrow.
     virtual void setPointer(WindowId /*window*/, PointerShape /*shape*/) {}
+    // While a window has an area where text is typed, typed text comes as events, and what an input method
+    // shows lies at the area. Without one, as at first, it does not.
+    virtual void setTextInput(WindowId /*window*/, std::optional<Rect> /*area*/) {}
+
     // Of the first screen.
     virtual Size screenSize() { return {1024, 768}; }
 
-    // Opens a file or an address with whatever program the desktop has for it, in the given folder, and comes
-    // back at once. That it fails is not reported.
-    virtual void openDocument(const std::string& /*document*/, const std::string& /*folder*/) {}
+    // The whole of a file that comes with the program; empty when there is none or it cannot be read.
+    virtual std::vector<std::byte> programFile(std::string_view name) = 0;
 
-    // While a window has an area where text is typed, typed text comes as events, and what an input method
-    // shows lies at the area. Without one it does not. A window that does not exist has none.
-    virtual void setTextInput(WindowId /*window*/, std::optional<Rect> /*area*/) {}
+    // Opens a web address, which has "://" in it, or a file that comes with the program, by its name, with
+    // whatever the machine has for it. That it fails is not reported.
+    virtual void openDocument(std::string_view /*document*/) {}
 
-    // The text that the desktop's programs exchange, UTF-8.
+    // The text that programs exchange; empty when there is none. That it cannot be set is not reported.
     virtual std::string clipboardText() { return {}; }
     virtual void setClipboardText(const std::string& /*text*/) {}
-
-    // The folder of the running program, without a separator at its end.
-    virtual std::string executableFolder() = 0;
 };
 
 }  // namespace quabble

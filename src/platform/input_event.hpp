@@ -19,7 +19,7 @@ enum class EventKind {
     Restored
 };
 
-// Key codes of the characters that mean something here; every other key press carries its own character.
+// Key codes of the characters that mean something here. All other characters mean the same.
 namespace keys {
 constexpr std::int16_t backspace = 8;
 constexpr std::int16_t tab = 9;
@@ -44,16 +44,21 @@ enum class EditCommand {
     Paste
 };
 
-// Something that happened to a window.
+// Something that happened to a window. Events for windows that are closed, or that a dialog keeps from taking
+// input, are ignored.
 struct InputEvent {
     WindowId window = WindowId::none;
     EventKind kind = EventKind::MouseMove;
-    float x = 0;  // of a mouse event, in client pixels
+    // Of a mouse event: the program's pixel that is seen at the pointer, a whole one, counted from the client
+    // area's top left corner. It may lie outside while a button is held.
+    float x = 0;
     float y = 0;
-    std::int16_t key = 0;  // of a key press: a key that yields a character, modifiers alone do not
-    EditCommand command = EditCommand::Left;
-    bool extends = false;         // of an edit or a mouse press: Shift is held, the selection grows
-    std::string text = {};        // of a text input, UTF-8
+    // Of a key press: the character that the key yields. A press is reported once, not again while the key is
+    // held; arrows, function keys, modifiers and keys pressed together with Ctrl or Alt yield none.
+    std::int16_t key = 0;
+    EditCommand command = EditCommand::Left;  // of an edit, which is reported again while its keys are held
+    bool extends = false;                     // of an edit or a mouse press: Shift is held
+    std::string text = {};                    // of a text input, UTF-8
     bool continuesClick = false;  // of a mouse press: it follows another quickly, as in a double click
 };
 

@@ -16,6 +16,7 @@ Task<> MessageLoop::runPendingMessages() {
 }
 
 Task<> MessageLoop::showModal(Window& window) {
+    assert(modalWindow() == nullptr || modalWindow() == window.owner_);
     window.show();
     {
         const ModalWindow modal(*this, window);
@@ -54,8 +55,11 @@ void MessageLoop::post(const InputEvent& event) {
 }
 
 void MessageLoop::wake() {
+    assert(!isAwake_);
+    isAwake_ = true;
     while (program_ && isOver(programWaitsUntil_))
         std::exchange(program_, {}).resume();
+    isAwake_ = false;
 }
 
 std::optional<TimePoint> MessageLoop::nextDeadline() const {
@@ -69,14 +73,6 @@ std::optional<TimePoint> MessageLoop::nextDeadline() const {
     for (const Timer* timer : timers_)
         earliest = std::min(earliest, timer->nextDue());
     return earliest == Timer::never ? std::nullopt : std::optional(earliest);
-}
-
-bool MessageLoop::requestEnd() {
-    bool kept = true;
-    for (Window* window : windows_)
-        kept = (!window->isShown() || window->Form_Terminate()) && kept;
-    end();
-    return kept;
 }
 
 bool MessageLoop::isOver(std::optional<TimePoint> wait) const {

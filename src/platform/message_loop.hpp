@@ -6,7 +6,6 @@
 #include <utility>
 #include <vector>
 
-#include "base/reused_memory.hpp"
 #include "base/task.hpp"
 #include "platform/front_end.hpp"
 #include "platform/input_event.hpp"
@@ -33,19 +32,20 @@ class MessageLoop {
 
     // --- The program's face ---
 
-    // Waits; what happens meanwhile is delivered later.
+    // Waits; what happens meanwhile is delivered later. A pause of nothing or less is over at once.
     auto pause(milliseconds duration) { return Wait{*this, frontEnd_.now() + duration}; }
 
     // Delivers what is waiting and comes back when those handlers are done.
     Task<> runPendingMessages();
 
-    // Shows the window and delivers messages until it closes. Windows below it take no input meanwhile.
+    // Shows the window and delivers messages until it closes; no other window takes input meanwhile. The
+    // window that took input before must be its owner, if there was such a one.
     Task<> showModal(Window& window);
 
     // Delivers messages until the program ends; it never comes back.
     Task<> run();
 
-    // Ends the program: nothing is delivered and no wait comes back from now on.
+    // Nothing is delivered and no wait comes back from now on.
     void end() { ended_ = true; }
 
     // --- The host's face ---
@@ -53,15 +53,12 @@ class MessageLoop {
     // Something happened. It is delivered when the program next asks for messages.
     void post(const InputEvent& event);
 
-    // Lets the program go on as far as it can: until it waits for something that has not happened yet.
+    // Lets the program go on as far as it can: until it waits for something that has not happened yet. Not to
+    // be called from inside the program.
     void wake();
 
     // When to wake the program at the latest, if no event comes before.
     std::optional<TimePoint> nextDeadline() const;
-
-    // The process is to end: the program ends at once, whatever it is waiting for, and shows nothing. False
-    // when something that should last could not be kept.
-    bool requestEnd();
 
     bool ended() const { return ended_; }
 
@@ -113,7 +110,7 @@ class MessageLoop {
     Window* findWindow(WindowId id) const;
 
     FrontEnd& frontEnd_;
-    std::pmr::deque<InputEvent> events_{&reusedMemory()};
+    std::deque<InputEvent> events_;
     std::vector<Timer*> timers_;
     std::vector<Window*> windows_;
     std::vector<Window*> modalWindows_;
@@ -121,6 +118,7 @@ class MessageLoop {
     std::coroutine_handle<> program_;
     std::optional<TimePoint> programWaitsUntil_;
     std::uint32_t lastWindowId_ = 0;
+    bool isAwake_ = false;  // the program is being carried on
     bool ended_ = false;
 };
 

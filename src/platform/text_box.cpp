@@ -19,29 +19,29 @@ void TextBox::clear() {
     moveCaret(0, false);
 }
 
-void TextBox::paint(Surface& surface, bool hasFocus) const {
-    surface.fill(area, paper);
-    paintControlEdge(surface, area, hasFocus);
-    // The line is drawn on a picture of its own, which cuts off what lies outside the box.
+void TextBox::paint(Canvas& canvas, bool hasFocus) const {
+    canvas.fill(area, paper);
+    paintControlEdge(canvas, area, hasFocus);
+    // The line is drawn on a canvas of its own, which cuts off what lies outside the box.
     const Rect window = inner();
-    Surface line(window.width(), window.height());
+    Canvas line({window.width(), window.height()});
     line.fill(line.bounds(), paper);
     const Rect place{-scroll_, 0, widthUpTo(text_.size()) - scroll_ + 1, window.height()};
     constexpr std::int32_t format = text_format::verticalCentre + text_format::singleLine;
-    drawText(line, place, text_, format, controlInk, font);
+    line.write(place, text_, format, font, controlInk);
     const auto [first, last] = std::minmax(caret_, anchor_);
     if (first != last) {
         const Rect marked{widthUpTo(first) - scroll_, 0, widthUpTo(last) - scroll_, window.height()};
-        Surface highlighted(line.width(), line.height());
+        Canvas highlighted({window.width(), window.height()});
         highlighted.fill(highlighted.bounds(), selected);
-        drawText(highlighted, place, text_, format, paper, font);
-        line.copy(marked, highlighted, {marked.left, 0});
+        highlighted.write(place, text_, format, font, paper);
+        line.copy(marked, highlighted.picture(), {marked.left, 0});
     }
     if (hasFocus) {
         const std::int32_t x = widthUpTo(caret_) - scroll_;
         line.fill({x, 1, x + 1, window.height() - 1}, controlInk);
     }
-    surface.copy(window, line, {0, 0});
+    canvas.copy(window, line.picture(), {0, 0});
 }
 
 Task<> TextBox::mouseDown(Point at, bool extends) {

@@ -29,7 +29,7 @@ class TextBox final : public Control {
     std::size_t caret() const { return caret_; }
     std::size_t anchor() const { return anchor_; }
 
-    void paint(Surface& surface, bool hasFocus) const override;
+    void paint(Canvas& canvas, bool hasFocus) const override;
     Task<> mouseDown(Point at, bool extends) override;
     void mouseDrag(Point at) override;
     bool takesFocus() const override { return true; }

@@ -32,7 +32,7 @@ void Timer::startPeriod() {
 Task<> Timer::tick() {
     const auto late = loop_.frontEnd().now() - due_;
     due_ += interval_ * (late / interval_ + 1);
-    return tick_();
+    co_await tick_();
 }
 
 }  // namespace quabble

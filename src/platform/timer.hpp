@@ -11,7 +11,7 @@ namespace quabble {
 // and the next one is due at the following whole period. It starts switched off, with no interval.
 class Timer {
  public:
-    // `tick` makes the handler's task.
+    // `tick` makes the handler's task. The loop must outlive the timer.
     Timer(MessageLoop& loop, std::function<Task<>()> tick);
     ~Timer();
     Timer(const Timer&) = delete;

@@ -1,17 +1,34 @@
 #include "platform/window.hpp"
 
 #include <algorithm>
+#include <cassert>
 #include <cmath>
 #include <ranges>
 #include <utility>
 
 namespace quabble {
+namespace {
+
+// Counts a handler for as long as it runs.
+class HandlerCount {
+ public:
+    explicit HandlerCount(int& running) : running_(running) { ++running_; }
+    ~HandlerCount() { --running_; }
+    HandlerCount(const HandlerCount&) = delete;
+    HandlerCount& operator=(const HandlerCount&) = delete;
+
+ private:
+    int& running_;
+};
+
+}  // namespace
 
 Window::Window(MessageLoop& loop, Window* owner) : loop_(loop), owner_(owner) {
     loop_.windows_.push_back(this);
 }
 
 Window::~Window() {
+    assert(handlersRunning_ == 0);
     if (shown_)
         loop_.frontEnd().closeWindow(id_);
     std::erase(loop_.windows_, this);
@@ -23,11 +40,11 @@ Size Window::outerSize() const {
 
 void Window::setClientSize(Size size) {
     traits_.clientSize = size;
-    canvas_.picture = Surface(size.width, size.height);
+    canvas_ = Canvas(size);
 }
 
 void Window::show() {
-    shown_ = true;
+    assert(!shown_);
     state_ = State::Normal;
     focus_ = nullptr;
     pressed_ = nullptr;
@@ -37,6 +54,7 @@ void Window::show() {
     Form_Load();
     traits_.owner = owner_ == nullptr ? WindowId::none : owner_->id_;
     loop_.frontEnd().createWindow(id_, traits_);
+    shown_ = true;
     tellWhereTextIsTyped();
     refresh();
 }
@@ -57,15 +75,15 @@ void Window::refresh() {
     const bool covered =
         std::ranges::any_of(controls_, [](const Control* control) { return control->visible; });
     if (!covered) {
-        loop_.frontEnd().showPixels(id_, canvas_.picture);
+        loop_.frontEnd().showPixels(id_, canvas_.picture());
         return;
     }
-    composed_ = canvas_.picture;
+    composed_ = canvas_;
     for (const Control* control : controls_) {
         if (control->visible)
             control->paint(composed_, control == focus_);
     }
-    loop_.frontEnd().showPixels(id_, composed_);
+    loop_.frontEnd().showPixels(id_, composed_.picture());
 }
 
 void Window::minimise() {
@@ -89,7 +107,8 @@ Task<> Window::Form_KeyPress(std::int16_t) {
 
 void Window::setFocus(Control* control) {
     focus_ = control;
-    tellWhereTextIsTyped();
+    if (shown_)
+        tellWhereTextIsTyped();
 }
 
 void Window::tellWhereTextIsTyped() {
@@ -111,6 +130,7 @@ void Window::tellPointer() {
 }
 
 Task<> Window::handle(InputEvent event) {
+    const HandlerCount count(handlersRunning_);
     const Point at{static_cast<std::int32_t>(std::floor(event.x)),
                    static_cast<std::int32_t>(std::floor(event.y))};
     switch (event.kind) {

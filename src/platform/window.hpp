@@ -24,7 +24,8 @@ class Window {
     // a window's outer size count with it.
     static constexpr Size nominalFrame{6, 29};
 
-    // A window with an owner is a dialog. The loop and the owner must outlive it.
+    // A window with an owner is a dialog. The loop and the owner must outlive it, and it must outlive what
+    // its handlers wait for.
     explicit Window(MessageLoop& loop, Window* owner = nullptr);
     virtual ~Window();
     Window(const Window&) = delete;
@@ -40,7 +41,8 @@ class Window {
     Size clientSize() const { return traits_.clientSize; }
     Size outerSize() const;
 
-    // Loads the window (Form_Load), which sets its size, caption and picture, and puts it on the screen.
+    // Loads the window (Form_Load), which sets its size, caption and picture, and puts it on the screen. It
+    // must not be there yet.
     void show();
     // Closes the window (Form_Unload). It can be shown again.
     void unload();
@@ -68,8 +70,6 @@ class Window {
     // The user wants the window to close; this unloads it.
     virtual Task<> Form_QueryUnload();
     virtual void Form_Unload() {}
-    // The process is to end, at once and without a question. False when something could not be kept.
-    virtual bool Form_Terminate() { return true; }
     // The window was minimised or restored.
     virtual void Form_Resize() {}
     virtual Task<> Form_MouseDown(float x, float y);
@@ -94,13 +94,14 @@ class Window {
     WindowId id_ = WindowId::none;
     NativeWindow traits_;
     Canvas canvas_;
-    Surface composed_;
+    Canvas composed_;
     std::vector<Control*> controls_;
     Control* focus_ = nullptr;
     Control* pressed_ = nullptr;  // the control on which the mouse button went down
     float pointerX_ = -1;         // where the pointer was seen last
     float pointerY_ = -1;
     PointerShape pointer_ = PointerShape::Arrow;
+    int handlersRunning_ = 0;
     bool shown_ = false;
     State state_ = State::Normal;
 };

@@ -23,12 +23,12 @@ std::string acceptedName(const std::string& typed) {
     return typed.substr(0, longestName);
 }
 
-NameEntry::NameEntry(MessageLoop& loop, Window& owner) : Window(loop, &owner), txtName_(loop.frontEnd()) {
+NameEntry::NameEntry(MessageLoop& loop, Window& owner)
+    : Window(loop, &owner), txtName_(loop.frontEnd()), OKButton_([this] { return OKButton_Click(); }) {
     txtName_.font = font;
     txtName_.area = Rect::ofSize(margin, 108, dialogSize.width - 2 * margin, 28);
     txtName_.visible = true;
     OKButton_.visible = true;
-    OKButton_.onClick = [this] { return OKButton_Click(); };
     addControl(txtName_);
     addControl(OKButton_);
 }
@@ -36,21 +36,21 @@ NameEntry::NameEntry(MessageLoop& loop, Window& owner) : Window(loop, &owner), t
 void NameEntry::Form_Load() {
     setCaption("Best Score");
     setClientSize(dialogSize);
-    canvas().picture.fill(canvas().picture.bounds(), palette::backgroundColour);
-    const auto label = [this](std::int32_t top, std::int32_t height, Colour colour) {
-        return ScreenButton{.surface = &canvas(),
-                            .left = margin,
+    canvas().fill(canvas().bounds(), palette::backgroundColour);
+    const auto label = [](std::int32_t top, std::int32_t height, Colour colour, const Font& labelFont) {
+        return ScreenButton{.left = margin,
                             .top = top,
                             .width = dialogSize.width - 2 * margin,
                             .height = height,
-                            .textColour = colour};
+                            .textColour = colour,
+                            .font = labelFont};
     };
-    canvas().font = messageFont;
-    drawShadowText(label(22, 44, palette::valueColour), 1, congratulation, text_format::centre);
-    canvas().font = font;
-    drawShadowText(label(84, 22, palette::highlightColour), 1, "Enter Your Name", defaultTextFormat);
-    const ScreenButton okButton = layOutOkButton(canvas(), (dialogSize.width - okButtonSize.width) / 2, 156);
-    drawOkButton(okButton);
+    drawShadowText(canvas(), label(22, 44, palette::valueColour, messageFont), 1, congratulation,
+                   text_format::centre);
+    drawShadowText(canvas(), label(84, 22, palette::highlightColour, font), 1, "Enter Your Name",
+                   defaultTextFormat);
+    const ScreenButton okButton = layOutOkButton((dialogSize.width - okButtonSize.width) / 2, 156);
+    drawOkButton(canvas(), okButton);
     OKButton_.area = okButton.rect();
     txtName_.clear();
     setFocus(&txtName_);

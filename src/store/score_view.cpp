@@ -22,9 +22,8 @@ ScoreView::ScoreView(MessageLoop& loop, Window& owner, HighScores& highScores, s
 void ScoreView::Form_Load() {
     setCaption("Best Scores - " + std::string(applicationTitle));
     setClientSize(viewSize);
-    canvas().font = font;
     layOut();
-    fillBox(background_);
+    canvas().fill(canvas().bounds(), palette::viewBrush.colour);
     for (std::size_t place = 0; place < highScorePlaces; ++place)
         drawRow(place);
     drawTitle();
@@ -34,51 +33,50 @@ void ScoreView::Form_Load() {
 
 void ScoreView::layOut() {
     const auto [width, height] = outerSize();
-    background_ = {.surface = &canvas(), .width = width, .height = height, .fillBrush = palette::viewBrush};
-    title_ = {.surface = &canvas(),
-              .left = roundHalfEven(width / 2.0 - 2 * unit_),
+    title_ = {.left = roundHalfEven(width / 2.0 - 2 * unit_),
               .top = roundHalfEven(unit_ / 2.0),
               .width = 4 * unit_,
               .height = 20,
               .fillBrush = palette::viewBrush,
-              .textColour = palette::labelColour};
+              .textColour = palette::labelColour,
+              .font = font};
     buttons_ = {layOutButton(2), layOutButton(6)};
 }
 
 ScreenButton ScoreView::layOutButton(std::int32_t leftUnits) {
-    return {.surface = &canvas(),
-            .left = leftUnits * unit_,
+    return {.left = leftUnits * unit_,
             .top = 9 * unit_,
             .width = 3 * unit_,
             .height = 30,
             .fillBrush = palette::backgroundBrush,
             .framePen = palette::lightPen,
-            .textColour = palette::panelTextColour};
+            .textColour = palette::panelTextColour,
+            .font = font};
 }
 
 void ScoreView::drawTitle() {
     const auto title = static_cast<std::uint16_t>(string_ids::mainMenuBase + modeNum);
-    drawLabelledBox(title_, BoxStyle::Plain, false, 2, loadString(title));
+    drawLabelledBox(canvas(), title_, BoxStyle::Plain, false, 2, loadString(title));
 }
 
 void ScoreView::drawRow(std::size_t place) {
     const HighScoreTable& table = highScores_.table(modeNum);
-    ScreenButton box{.surface = &canvas(),
-                     .left = unit_,
+    ScreenButton box{.left = unit_,
                      .top = unit_ * static_cast<std::int32_t>(place + 1),
                      .width = 6 * unit_,
                      .height = unit_,
                      .fillBrush = palette::viewBrush,
-                     .textColour = palette::highlightColour};
-    drawShadowText(box, 1, table.names[place], defaultTextFormat);
+                     .textColour = palette::highlightColour,
+                     .font = font};
+    drawShadowText(canvas(), box, 1, table.names[place], defaultTextFormat);
     box.left = 8 * unit_;
     box.width = 2 * unit_;
-    drawShadowText(box, 1, std::to_string(table.scores[place]), defaultTextFormat);
+    drawShadowText(canvas(), box, 1, std::to_string(table.scores[place]), defaultTextFormat);
 }
 
 void ScoreView::drawButton(std::size_t i, bool highlighted) {
     const auto caption = static_cast<std::uint16_t>(string_ids::scoreViewBase + 1 + i);
-    drawLabelledBox(buttons_[i], highlighted ? BoxStyle::Framed : BoxStyle::Plain, highlighted,
+    drawLabelledBox(canvas(), buttons_[i], highlighted ? BoxStyle::Framed : BoxStyle::Plain, highlighted,
                     highlighted ? 6 : 4, loadString(caption));
 }
 
@@ -110,7 +108,7 @@ Task<> ScoreView::Form_KeyPress(std::int16_t key) {
 
 // There is no question first. Which button is hovered stays as it was, though both are drawn at rest.
 void ScoreView::clearScores() {
-    fillBox(background_);
+    canvas().fill(canvas().bounds(), palette::viewBrush.colour);
     drawTitle();
     HighScoreTable& table = highScores_.table(modeNum);
     for (std::size_t place = 0; place < highScorePlaces; ++place) {

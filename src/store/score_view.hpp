@@ -36,7 +36,6 @@ class ScoreView final : public Window {
 
     HighScores& highScores_;
     std::int32_t unit_;
-    ScreenButton background_;
     ScreenButton title_;
     std::array<ScreenButton, 2> buttons_;
 };

@@ -1,5 +1,6 @@
 #include "store/settings_store.hpp"
 
+#include <algorithm>
 #include <optional>
 #include <span>
 #include <string>
@@ -9,7 +10,12 @@
 namespace quabble {
 namespace {
 
-constexpr std::size_t nameBuffer = 25;  // a name of 24 bytes and the zero byte at its end
+constexpr std::size_t longestName = 25;  // a name of 24 bytes and the zero byte at its end
+
+// The program's own key.
+std::string ownKey() {
+    return "Software\\Vorlane\\" + std::string(applicationTitle) + "\\" + versionText();
+}
 
 // Numbers are kept with their least significant byte first, whatever the machine.
 template <typename Number>
@@ -35,16 +41,30 @@ std::array<std::byte, count * sizeof(Number)> bytesOf(const std::array<Number, c
     return bytes;
 }
 
-// Reads numbers; what the stored value is too short for keeps its old value. False when there is none to
-// read.
+// A value's bytes; nothing when there is no such value or it is larger than that.
+std::optional<std::vector<std::byte>> queryBytes(RegistryTransaction& registry, std::string_view name,
+                                                 std::size_t largest) {
+    auto value = registry.query(ownKey(), name);
+    if (!value || value->data.size() > largest)
+        return std::nullopt;
+    return std::move(value->data);
+}
+
+// Reads bytes; what the stored value is too short for stays as it was. False when there is none to read.
+bool query(RegistryTransaction& registry, std::string_view name, std::span<std::byte> bytes) {
+    const auto stored = queryBytes(registry, name, bytes.size());
+    if (stored)
+        std::ranges::copy(*stored, bytes.begin());
+    return stored.has_value();
+}
+
 template <typename Number, std::size_t count>
-bool queryNumbers(const RegistryKey& key, std::string_view name, std::array<Number, count>& numbers) {
+bool queryNumbers(RegistryTransaction& registry, std::string_view name, std::array<Number, count>& numbers) {
     auto bytes = bytesOf(numbers);
-    if (!key.query(name, bytes))
-        return false;
+    const bool isStored = query(registry, name, bytes);
     for (std::size_t i = 0; i < count; ++i)
         numbers[i] = readNumber<Number>(bytes, i);
-    return true;
+    return isStored;
 }
 
 std::string scoresName(std::int16_t table) {
@@ -54,42 +74,37 @@ std::string playerName(std::int16_t table, std::size_t place) {
     return scoresName(table) + std::to_string(place + 1);
 }
 
-std::optional<std::string> queryName(const RegistryKey& key, std::string_view name) {
-    std::array<std::byte, nameBuffer> buffer{};
-    const auto found = key.query(name, buffer);
-    if (!found)
+std::optional<std::string> queryName(RegistryTransaction& registry, std::string_view name) {
+    const auto stored = queryBytes(registry, name, longestName);
+    if (!stored)
         return std::nullopt;
     // A value without even the zero byte, which only others could have stored, is an empty name.
-    const std::size_t length = found->size == 0 ? 0 : found->size - 1;
-    return std::string(reinterpret_cast<const char*>(buffer.data()), length);
+    const std::size_t length = stored->empty() ? 0 : stored->size() - 1;
+    return std::string(reinterpret_cast<const char*>(stored->data()), length);
 }
 
-void loadTable(const RegistryKey& key, std::int16_t number, HighScoreTable& table) {
-    queryNumbers(key, scoresName(number), table.scores);
+void loadTable(RegistryTransaction& registry, std::int16_t number, HighScoreTable& table) {
+    queryNumbers(registry, scoresName(number), table.scores);
     for (std::size_t place = 0; place < table.names.size(); ++place) {
-        const auto name = queryName(key, playerName(number, place));
+        const auto name = queryName(registry, playerName(number, place));
         table.names[place] = name.value_or(unknownName);
         if (!name)
             table.scores[place] = 0;
     }
 }
 
-void saveTable(RegistryKey& key, std::int16_t number, const HighScoreTable& table) {
-    key.set(scoresName(number), ValueType::Binary, bytesOf(table.scores));
+// That a value cannot be set shows when the transaction is committed.
+void setBytes(RegistryTransaction& registry, std::string_view name, std::span<const std::byte> bytes) {
+    registry.set(ownKey(), name, ValueType::Binary, bytes);
+}
+
+void saveTable(RegistryTransaction& registry, std::int16_t number, const HighScoreTable& table) {
+    setBytes(registry, scoresName(number), bytesOf(table.scores));
     for (std::size_t place = 0; place < table.names.size(); ++place) {
         const std::string& name = table.names[place];
         const auto withZero = std::as_bytes(std::span(name.c_str(), name.size() + 1));
-        key.set(playerName(number, place), ValueType::String, withZero);
+        registry.set(ownKey(), playerName(number, place), ValueType::String, withZero);
     }
-}
-
-// The program's own key.
-std::optional<RegistryKey> openStore(Registry& registry, Access access) {
-    const auto software = registry.openKey("Software", access);
-    if (!software)
-        return std::nullopt;
-    const std::string subkey = "Vorlane\\" + std::string(applicationTitle) + "\\" + versionText();
-    return software->createKey(subkey, "USERDATA");
 }
 
 }  // namespace
@@ -104,29 +119,36 @@ void SolvingData::setSplashSeen() {
     writeNumber(std::span<std::byte>(bytes), 2, std::int16_t{1});
 }
 
-StoreResult loadSettings(Settings& settings, HighScores& highScores, Registry& registry) {
-    const auto key = openStore(registry, Access::Read);
-    if (!key)
+std::unique_ptr<RegistryTransaction> SettingsStore::begin(Access access) {
+    auto transaction = isGivenUp_ ? nullptr : registry_.begin(access);
+    isGivenUp_ = transaction == nullptr;
+    return transaction;
+}
+
+StoreResult SettingsStore::loadSettings(Settings& settings, HighScores& highScores) {
+    const auto registry = begin(Access::Read);
+    if (!registry)
         return StoreResult::NotOpened;
-    key->query("SOLVINGDATA", settings.solvingData.bytes);
-    key->query("NUMWFSF", settings.numwfsf);
-    if (!queryNumbers(*key, "SOUNDOPTIONS", settings.soundOptions))
+    query(*registry, "SOLVINGDATA", settings.solvingData.bytes);
+    query(*registry, "NUMWFSF", settings.numwfsf);
+    if (!queryNumbers(*registry, "SOUNDOPTIONS", settings.soundOptions))
         settings.soundOptions.fill(1);
     for (std::int16_t table = 1; table <= highScoreTables; ++table)
-        loadTable(*key, table, highScores.table(table));
+        loadTable(*registry, table, highScores.table(table));
     return StoreResult::Done;
 }
 
-StoreResult saveSettings(const Settings& settings, const HighScores& highScores, Registry& registry) {
-    auto key = openStore(registry, Access::Write);
-    if (!key)
+StoreResult SettingsStore::saveSettings(const Settings& settings, const HighScores& highScores) {
+    const auto registry = begin(Access::Write);
+    if (!registry)
         return StoreResult::NotOpened;
-    key->set("SOLVINGDATA", ValueType::Binary, settings.solvingData.bytes);
-    key->set("NUMWFSF", ValueType::Binary, settings.numwfsf);
-    key->set("SOUNDOPTIONS", ValueType::Binary, bytesOf(settings.soundOptions));
+    registry->createKey(ownKey(), "USERDATA");
+    setBytes(*registry, "SOLVINGDATA", settings.solvingData.bytes);
+    setBytes(*registry, "NUMWFSF", settings.numwfsf);
+    setBytes(*registry, "SOUNDOPTIONS", bytesOf(settings.soundOptions));
     for (std::int16_t table = 1; table <= highScoreTables; ++table)
-        saveTable(*key, table, highScores.table(table));
-    return key->commit() ? StoreResult::Done : StoreResult::NotWritten;
+        saveTable(*registry, table, highScores.table(table));
+    return registry->commit() ? StoreResult::Done : StoreResult::NotWritten;
 }
 
 }  // namespace quabble

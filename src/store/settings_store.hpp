@@ -3,9 +3,10 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <memory>
 
 #include "engine/high_scores.hpp"
-#include "platform/registry.hpp"
+#include "platform/registry_store.hpp"
 
 namespace quabble {
 
@@ -34,12 +35,26 @@ constexpr const char* unknownName = "Anononymous";
 // What became of the settings. The user is told of a registry that could not be opened, and of nothing else.
 enum class StoreResult { Done, NotOpened, NotWritten };
 
-// Fills the settings and the tables from the registry. Each value that is missing or unreadable has a default
-// of its own; when the registry cannot be opened everything stays as it was.
-StoreResult loadSettings(Settings& settings, HighScores& highScores, Registry& registry);
+// The settings and the tables as they are kept between runs. Once the registry could not be opened it is left
+// alone: nobody is to overwrite what he has never read.
+class SettingsStore {
+ public:
+    // The registry must outlive the store.
+    explicit SettingsStore(RegistryStore& registry) : registry_(registry) {}
 
-// Writes the settings and the tables, all or nothing: when something cannot be written, what was kept before
-// stays.
-StoreResult saveSettings(const Settings& settings, const HighScores& highScores, Registry& registry);
+    // Fills the settings and the tables. Each value that is missing or unreadable has a default of its own;
+    // when the registry cannot be opened everything stays as it was.
+    StoreResult loadSettings(Settings& settings, HighScores& highScores);
+
+    // Writes the settings and the tables, all or nothing: when something cannot be written, what was kept
+    // before stays.
+    StoreResult saveSettings(const Settings& settings, const HighScores& highScores);
+
+ private:
+    std::unique_ptr<RegistryTransaction> begin(Access access);
+
+    RegistryStore& registry_;
+    bool isGivenUp_ = false;
+};
 
 }  // namespace quabble

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 #include <stb/stb_image.h>
+#include <stb/stb_image_write.h>
 
 #include <algorithm>
 #include <functional>
@@ -28,7 +29,11 @@ struct MachineInAMove : Machine {
 void expectGolden(const Surface& seen, const std::string& name) {
     const std::string kept = QUABBLE_GOLDEN_FOLDER + name;
     const std::string written = std::getenv("QUABBLE_REFRESH_GOLDEN") ? kept : QUABBLE_SEEN_FOLDER + name;
-    const auto bytes = bytesOf(seen);
+    std::vector<unsigned char> bytes;
+    for (std::int32_t y = 0; y < seen.height(); ++y) {
+        for (const std::uint32_t pixel : seen.row(y))
+            bytes.insert(bytes.end(), {colourOf(pixel).red, colourOf(pixel).green, colourOf(pixel).blue});
+    }
     stbi_write_png(written.c_str(), seen.width(), seen.height(), 3, bytes.data(), 0);
     if (!QUABBLE_GOLDEN_TYPEFACE)
         GTEST_SKIP() << "the pictures kept show other typefaces";
@@ -147,26 +152,26 @@ TEST(Program, EndsWheneverItIsAskedTo) {
         MachineInAMove closed(1, at);
         closed.user.clickCloseButton();
         closed.user.wait(1s);  // which a pause of the move does not notice before it is over
-        EXPECT_TRUE(closed.loop.ended()) << at.count();
+        EXPECT_TRUE(closed.program.ended()) << at.count();
         MachineInAMove told(1, at);
-        told.loop.requestEnd();
-        EXPECT_TRUE(told.loop.ended()) << at.count();
+        told.program.requestEnd();
+        EXPECT_TRUE(told.program.ended()) << at.count();
     }
     MachineInAMove atResult(1, 500ms, lastCluster);
     ASSERT_TRUE(atResult.hasDialog());
-    atResult.loop.requestEnd();
-    EXPECT_TRUE(atResult.loop.ended());
+    atResult.program.requestEnd();
+    EXPECT_TRUE(atResult.program.ended());
 }
 
 TEST(Program, IsNotClosedBehindADialog) {
     MachineInAMove machine(1, 500ms, lastCluster);
-    machine.loop.post({machine.app.frmQuabble().id(), EventKind::CloseButton});
-    machine.loop.wake();
+    machine.program.post({machine.program.frmQuabble().id(), EventKind::CloseButton});
+    machine.program.wake();
     EXPECT_TRUE(machine.hasDialog());
-    EXPECT_FALSE(machine.loop.ended());
+    EXPECT_FALSE(machine.program.ended());
     machine.user.clickCloseButton();
     machine.clickMenu(8);
-    EXPECT_TRUE(machine.loop.ended()) << "Exit";
+    EXPECT_TRUE(machine.program.ended()) << "Exit";
     EXPECT_TRUE(machine.frontEnd.windows().empty());
 }
 
@@ -191,7 +196,7 @@ TEST(Pause, CoversEverythingUntilAClickThatDoesNothingElse) {
         machine.user.restore();
         machine.user.press('q');
         EXPECT_FALSE(machine.shown().minimised) << "a paused game does not hide";
-        const Surface beneath = machine.app.frmQuabble().canvas().picture;
+        const Surface beneath = machine.program.frmQuabble().canvas().picture();
         machine.user.movePointer(95, 385);
         machine.clickPanel(8);
         EXPECT_FALSE(machine.isPaused());

@@ -30,17 +30,17 @@ struct MachineWithAScore : Machine {
 };
 
 TEST(NameEntry, TakesTheNameHoweverItIsClosedAndShowsTheTable) {
-    const std::pair<const char*, std::function<void(ScriptedUser&)>> ways[] = {
-        {"Enter", [](ScriptedUser& user) { user.press(keys::enter); }},
-        {"Esc", [](ScriptedUser& user) { user.press(keys::escape); }},
-        {"the frame", [](ScriptedUser& user) { user.clickCloseButton(); }},
-        {"OK", [](ScriptedUser& user) { user.click(180, 171); }},
+    const std::pair<const char*, std::function<void(ScriptedUser<Program>&)>> ways[] = {
+        {"Enter", [](ScriptedUser<Program>& user) { user.press(keys::enter); }},
+        {"Esc", [](ScriptedUser<Program>& user) { user.press(keys::escape); }},
+        {"the frame", [](ScriptedUser<Program>& user) { user.clickCloseButton(); }},
+        {"OK", [](ScriptedUser<Program>& user) { user.click(180, 171); }},
         {"Tab and space",
-         [](ScriptedUser& user) {
+         [](ScriptedUser<Program>& user) {
              user.press(keys::tab);
              user.press(keys::space);
          }},
-        {"Tab all the way round", [](ScriptedUser& user) {
+        {"Tab all the way round", [](ScriptedUser<Program>& user) {
              user.press(keys::tab);
              user.press(keys::tab);
              user.type("!");
@@ -113,12 +113,11 @@ TEST(ScoreView, ClearsTheTableThatItShows) {
 }
 
 TEST(Splash, ClosesOnItsSecondTickWhateverIsClicked) {
-    HeadlessFrontEnd frontEnd(programFolder.path.string());
-    MessageLoop loop(frontEnd);
-    Registry registry = Registry::inMemory();
-    AppState app(loop, registry, 1);
-    ScriptedUser user(frontEnd, loop);
-    Task<> program = runProgram(app);
+    HeadlessFrontEnd frontEnd;
+    MemoryBlob kept;
+    BlobRegistryStore registry(kept);
+    Program program(frontEnd, registry, 1);
+    ScriptedUser user(frontEnd, program);
     program.start();
     EXPECT_TRUE(user.top().traits.borderless);
     EXPECT_EQ(user.top().traits.clientSize, (Size{680, 450}));
@@ -129,20 +128,18 @@ TEST(Splash, ClosesOnItsSecondTickWhateverIsClicked) {
     user.press(keys::enter);
     EXPECT_TRUE(frontEnd.openedDocuments.empty());
     user.click(351, 401);
-    EXPECT_EQ(frontEnd.openedDocuments,
-              std::vector<std::string>{"https://quabble.example/ in " + programFolder.path.string()});
+    EXPECT_EQ(frontEnd.openedDocuments, std::vector<std::string>{"https://quabble.example/"});
     user.wait(99ms);
     EXPECT_TRUE(user.top().traits.borderless);
     user.wait(1ms);
     EXPECT_EQ(user.top().traits.caption, "Quabble  Ver 1.0");
     user.click(337, 383);
-    EXPECT_EQ(frontEnd.openedDocuments.back(),
-              programFolder.path.string() + "/QB_HELP.HTM in " + programFolder.path.string());
+    EXPECT_EQ(frontEnd.openedDocuments.back(), "QB_HELP.HTM");
 }
 
 // Where the registry should be lies something else, which stays as it is.
 struct MachineWithoutARegistry : Machine {
-    MachineWithoutARegistry() : Machine(Registry(programFolder.path.string())) {}
+    MachineWithoutARegistry() : Machine(MemoryBlob(std::vector<std::byte>(100))) {}
 };
 
 TEST(Program, TellsOfARegistryThatCannotBeOpenedAndGoesOn) {
@@ -159,28 +156,29 @@ TEST(Program, TellsOfARegistryThatCannotBeOpenedAndGoesOn) {
     EXPECT_TRUE(machine.hasDialog()) << "the main window is seen behind it";
     machine.user.wait(1h);
     EXPECT_EQ(machine.game.rowsEntered, 0) << "the game goes no further";
-    EXPECT_FALSE(machine.loop.ended());
+    EXPECT_FALSE(machine.program.ended());
     machine.closeDialog();
-    EXPECT_TRUE(machine.loop.ended());
+    EXPECT_TRUE(machine.program.ended());
     EXPECT_TRUE(machine.frontEnd.windows().empty());
 }
 
 TEST(Program, EndsInFrontOfItsMessageWhenItIsAskedTo) {
     MachineWithoutARegistry atStart;
-    EXPECT_TRUE(atStart.loop.requestEnd()) << "nothing has happened yet that should last";
-    EXPECT_TRUE(atStart.loop.ended());
+    EXPECT_TRUE(atStart.program.keep() && atStart.program.requestEnd())
+        << "nothing has happened yet that should last";
+    EXPECT_TRUE(atStart.program.ended());
     MachineWithoutARegistry atClose;
     atClose.closeDialog();
     atClose.user.wait(2s);
     atClose.clickMenu(8);
     ASSERT_TRUE(atClose.hasDialog());
-    EXPECT_FALSE(atClose.loop.requestEnd()) << "and the program can say so";
-    EXPECT_TRUE(atClose.loop.ended());
+    EXPECT_FALSE(atClose.program.requestEnd()) << "and the program can say so";
+    EXPECT_TRUE(atClose.program.ended());
 }
 
 // However the program ends after it has shown its main window, the settings are kept; before, they are not.
 TEST(Program, KeepsTheScoresWhenItEndsAndNotBefore) {
-    for (const std::string by : {"the desktop", "the close button", "Exit"}) {
+    for (const std::string by : {"the desktop", "the close button", "Exit", "a page that is hidden"}) {
         SCOPED_TRACE(by);
         MachineWithAScore machine;
         machine.user.type("Zo\u00EB \u20AC");
@@ -189,23 +187,25 @@ TEST(Program, KeepsTheScoresWhenItEndsAndNotBefore) {
         const auto kept = [&] {
             Settings settings;
             HighScores scores;
-            loadSettings(settings, scores, machine.registry);
+            SettingsStore(machine.registry).loadSettings(settings, scores);
             return std::to_string(settings.solvingData.scoreTableIndex()) +
                    std::to_string(std::to_integer<int>(settings.solvingData.bytes[4])) +
                    scores.table(1).names[2];
         };
         EXPECT_EQ(kept(), "00Anononymous");
-        if (by != "the desktop")  // which does not wait for the dialog
+        if (by == "the close button" || by == "Exit")  // the others do not wait for the dialog
             machine.closeDialog();
-        if (by == "Exit")
+        if (by == "a page that is hidden")
+            EXPECT_TRUE(machine.program.keep());
+        else if (by == "Exit")
             machine.clickMenu(8);
         else if (by == "the close button")
             machine.user.clickCloseButton();
         else
-            EXPECT_TRUE(machine.loop.requestEnd());
-        EXPECT_TRUE(machine.loop.ended());
+            EXPECT_TRUE(machine.program.requestEnd());
+        EXPECT_EQ(machine.program.ended(), by != "a page that is hidden");
         EXPECT_EQ(kept(), "11Zo\xEB \x80");
-        Machine next(std::move(machine.registry));
+        Machine next(machine.kept);
         next.clickMenu(4);
         EXPECT_TRUE(next.user.top().picture == seen);
     }

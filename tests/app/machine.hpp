@@ -1,13 +1,12 @@
 #pragma once
 
-#include <stb/stb_image_write.h>
-
 #include <set>
 
 #include "../engine/board_notation.hpp"
-#include "../support/files.hpp"
+#include "../support/bitmap.hpp"
 #include "app/program.hpp"
 #include "gfx/painters.hpp"
+#include "hosts/headless/memory_blob.hpp"
 #include "hosts/headless/scripted_user.hpp"
 
 namespace quabble {
@@ -19,15 +18,6 @@ inline Colour tileColour(std::int16_t tile) {
     return colourOf(static_cast<std::uint32_t>(0x0AF000 + tile * 0x11F035));
 }
 
-inline std::vector<unsigned char> bytesOf(const Surface& picture) {
-    std::vector<unsigned char> bytes;
-    for (std::int32_t y = 0; y < picture.height(); ++y) {
-        for (const std::uint32_t pixel : picture.row(y))
-            bytes.insert(bytes.end(), {colourOf(pixel).red, colourOf(pixel).green, colourOf(pixel).blue});
-    }
-    return bytes;
-}
-
 inline bool isFlat(const Surface& picture, const Rect& area) {
     std::set<std::uint32_t> colours;
     for (std::int32_t i = 0; i < area.width() * area.height(); ++i)
@@ -35,38 +25,33 @@ inline bool isFlat(const Surface& picture, const Rect& area) {
     return colours.size() == 1;
 }
 
-// The program's folder with the sheet in it; it goes with the process.
-struct ProgramFolder : TemporaryFolder {
-    ProgramFolder() {
-        Surface picture(400, 838);
-        for (std::int16_t tile = 0; tile < tiles::count; ++tile)
-            picture.fill(Rect::ofSize(tile * 28, 0, 28, 28), tileColour(tile));
-        picture.fill(Rect::ofSize(0, 28, 28, 28), maskColour);
-        picture.fill(Rect::ofSize(274, 29, 30, 241), fullGaugeColour);
-        picture.fill(Rect::ofSize(0, 338, 400, 500), {90, 10, 130});
-        stbi_write_bmp((path / "ALLPICDATA.BMP").c_str(), 400, 838, 3, bytesOf(picture).data());
-    }
-};
-inline const ProgramFolder programFolder;
+inline HeadlessFrontEnd::Files programFiles() {
+    Surface picture(400, 838);
+    for (std::int16_t tile = 0; tile < tiles::count; ++tile)
+        picture.fill(Rect::ofSize(tile * 28, 0, 28, 28), tileColour(tile));
+    picture.fill(Rect::ofSize(0, 28, 28, 28), maskColour);
+    picture.fill(Rect::ofSize(274, 29, 30, 241), fullGaugeColour);
+    picture.fill(Rect::ofSize(0, 338, 400, 500), {90, 10, 130});
+    return {{"ALLPICDATA.BMP", bitmapOf(picture)}};
+}
 
 // The program on its main menu, with high scores that are out of reach. Buttons are counted from 1.
 struct Machine {
-    HeadlessFrontEnd frontEnd{programFolder.path.string()};
-    MessageLoop loop{frontEnd};
-    Registry registry;
-    AppState app;
-    ScriptedUser user{frontEnd, loop};
+    HeadlessFrontEnd frontEnd{programFiles()};
+    MemoryBlob kept;
+    BlobRegistryStore registry{kept};
+    Program program;
+    ScriptedUser<Program> user{frontEnd, program};
+    AppState& app = program.state();
     GameState& game = app.game;
-    Task<> program = runProgram(app);
 
-    explicit Machine(std::uint64_t seed = 1) : Machine(Registry::inMemory(), seed) {
+    explicit Machine(std::uint64_t seed = 1) : Machine(MemoryBlob(), seed) {
         for (std::int16_t table = 1; table <= highScoreTables; ++table)
             app.highScores.table(table).scores.fill(1'000'000'000);
     }
     // With the high scores that an earlier run has left.
-    explicit Machine(Registry kept, std::uint64_t seed = 1)
-        : registry(std::move(kept)), app(loop, registry, seed) {
-        frontEnd.connect(loop);
+    explicit Machine(MemoryBlob ofEarlier, std::uint64_t seed = 1)
+        : kept(std::move(ofEarlier)), program(frontEnd, registry, seed) {
         program.start();
         user.wait(std::chrono::minutes(1));  // until the main menu is there
     }
@@ -88,15 +73,14 @@ struct Machine {
     }
     void setBoard(std::string_view rows) {
         game.grid = board(rows);
-        ScreenButton box{.surface = &app.frmQuabble().canvas(), .left = 232, .top = cell(1, 1).top};
-        box.cellSize = 28;
-        drawBoard(box, app.pictures.spriteSheet, game.grid);
-        app.frmQuabble().refresh();
+        MainWindow& window = program.frmQuabble();
+        drawBoard(window.canvas(), {232, cell(1, 1).top, 28}, app.pictures.spriteSheet, game.grid);
+        window.refresh();
     }
 
     bool hasDialog() const { return frontEnd.windows().size() > 1; }
-    bool isPaused() { return app.frmQuabble().isPaused(); }
-    const auto& shown() { return frontEnd.windows().at(app.frmQuabble().id()); }
+    bool isPaused() { return program.frmQuabble().isPaused(); }
+    const auto& shown() { return frontEnd.windows().at(program.frmQuabble().id()); }
     const Surface& picture() { return shown().picture; }
     Rect cell(int column, int row) const {
         const int above = game.gameMode == GameMode::Training ? 9 : 3;

@@ -18,7 +18,7 @@ class Monkey {
     explicit Monkey(Chance chance) : upTo(std::move(chance)) {}
 
     void actAndCheck() {
-        if (!machine_ || machine_->loop.ended()) {
+        if (!machine_ || machine_->program.ended()) {
             machine_ = std::make_unique<Machine>(static_cast<std::uint64_t>(upTo(256)));
             gamesEnded_ = 0;
             results_.clear();
@@ -27,7 +27,7 @@ class Monkey {
         act();
         const GameState& game = machine_->game;
         gamesEnded_ += played && !game.isGameActive();
-        if (machine_->loop.ended())
+        if (machine_->program.ended())
             return;
         const bool atEnd = !game.isGameActive() && !game.mainMenuActive;
         if (atEnd && machine_->user.top().traits.caption == "Game Statistics")
@@ -51,9 +51,9 @@ class Monkey {
         else if (choice < 640)
             machine_->user.press(machine_->hasDialog() ? keys::enter : keys::tab);
         else if (choice < 650)
-            machine_->frontEnd.minimiseWindow(machine_->app.frmQuabble().id());
+            machine_->frontEnd.minimiseWindow(machine_->program.frmQuabble().id());
         else if (choice < 690)
-            machine_->frontEnd.restoreWindow(machine_->app.frmQuabble().id());
+            machine_->frontEnd.restoreWindow(machine_->program.frmQuabble().id());
         else if (choice == 690)
             machine_->user.clickCloseButton();
         else if (choice <= 720)
@@ -81,9 +81,9 @@ class Monkey {
 
     // No move is under way: a message to no window would be taken at once.
     bool isSettled() {
-        machine_->loop.post({WindowId::none, EventKind::MouseMove});
-        const bool idle = machine_->loop.nextDeadline() == machine_->frontEnd.now();
-        machine_->loop.wake();
+        machine_->program.post({WindowId::none, EventKind::MouseMove});
+        const bool idle = machine_->program.nextDeadline() == machine_->frontEnd.now();
+        machine_->program.wake();
         return idle && !machine_->hasDialog();
     }
 
@@ -93,7 +93,7 @@ class Monkey {
         const bool paused = machine_->isPaused();
         const bool isTimed = game.arcadeActive && game.gameMode == GameMode::Timed;
         const bool mayTick = isTimed && !paused && !machine_->hasDialog();
-        const bool ticks = machine_->app.frmQuabble().isBlockTimerOn();
+        const bool ticks = machine_->program.frmQuabble().isBlockTimerOn();
         const int screens = game.mainMenuActive + game.classicActive + game.arcadeActive;
         EXPECT_LE(screens, 1);
         if (!mayTick) {

@@ -5,9 +5,9 @@
 #include <ranges>
 #include <string>
 
+#include "../support/files.hpp"
 #include "base/round_half_even.hpp"
 #include "colour_vision.hpp"
-#include "draw/bitmap_file.hpp"
 #include "draw/scaling.hpp"
 
 namespace quabble {
@@ -98,7 +98,7 @@ class Art : public ::testing::Test {
     // What there is to see on a tile beside its colour: the emblem of a block, the facets of a stone.
     TilePart figure(int tile) const { return darkOf(tile, partWithin({4, 4, 24, 24})); }
 
-    const Surface sheet_ = loadBitmap(QUABBLE_SHEET).value_or(Surface());
+    const Surface sheet_ = readPicture(QUABBLE_SHEET);
     const TilePart whole_ = partWithin({0, 0, 28, 28});
 };
 

@@ -92,14 +92,15 @@ class Robot {
     }
 
     bool showsScore() {
-        Canvas expected{Surface(140, 30), {Typeface::SansBold, 14, false}};
-        drawLabelledBox({.surface = &expected,
-                         .width = 140,
+        Canvas expected({140, 30});
+        drawLabelledBox(expected,
+                        {.width = 140,
                          .height = 30,
                          .fillBrush = palette::backgroundBrush,
-                         .textColour = palette::valueColour},
+                         .textColour = palette::valueColour,
+                         .font = {Typeface::SansBold, 14}},
                         BoxStyle::Plain, false, 2, std::to_string(score_));
-        return partOf(game_.look(), Rect::ofSize(25, 240, 140, 30)) == expected.picture;
+        return partOf(game_.look(), Rect::ofSize(25, 240, 140, 30)) == expected.picture();
     }
 
     void checkResult(GameMode mode) {
@@ -107,16 +108,16 @@ class Robot {
         GameState counted;
         counted.gameMode = mode;
         counted.stats = {.score = score_, .blocksCleared = blocks_, .largestCluster = largest_, .level = 1};
-        Canvas expected{Surface(457, 265), {Typeface::Sans, 12, false}};
-        const ScreenButton text{.surface = &expected,
-                                .left = 45,
+        Canvas expected({457, 265});
+        const ScreenButton text{.left = 45,
                                 .top = 45,
                                 .width = 373,
                                 .height = 114,
-                                .textColour = palette::panelTextColour};
-        drawShadowText(text, 2, resultText(counted, false), text_format::centre);
+                                .textColour = palette::panelTextColour,
+                                .font = {Typeface::Sans, 12}};
+        drawShadowText(expected, text, 2, resultText(counted, false), text_format::centre);
         waitUntil("the result as counted", [&] {
-            return partOf(desktop_.look(dialog), text.rect()) == partOf(expected.picture, text.rect());
+            return partOf(desktop_.look(dialog), text.rect()) == partOf(expected.picture(), text.rect());
         });
         desktop_.waitForFocus(dialog);
         desktop_.press(XK_Return);
@@ -131,20 +132,20 @@ class Robot {
 
     void checkBestEntry() {
         const WindowOnScreen view = desktop_.waitForWindow("Best Scores - Quabble");
-        Canvas expected{Surface(473, 473), {Typeface::SerifBold, 14.25, false}};
-        expected.picture.fill(expected.picture.bounds(), palette::backgroundColour);
-        ScreenButton box{.surface = &expected,
-                         .left = 45,
+        Canvas expected({473, 473});
+        expected.fill(expected.bounds(), palette::backgroundColour);
+        ScreenButton box{.left = 45,
                          .top = 45,
                          .width = 270,
                          .height = 45,
-                         .textColour = palette::highlightColour};
-        drawShadowText(box, 1, playerName, defaultTextFormat);
+                         .textColour = palette::highlightColour,
+                         .font = {Typeface::SerifBold, 14.25}};
+        drawShadowText(expected, box, 1, playerName, defaultTextFormat);
         box.left = 360;
-        drawShadowText(box, 1, std::to_string(score_), defaultTextFormat);
+        drawShadowText(expected, box, 1, std::to_string(score_), defaultTextFormat);
         const Rect seen{45, 45, 450, 90};
         waitUntil("the best score and its name",
-                  [&] { return partOf(desktop_.look(view), seen) == partOf(expected.picture, seen); });
+                  [&] { return partOf(desktop_.look(view), seen) == partOf(expected.picture(), seen); });
         desktop_.waitForFocus(view);
         desktop_.press(XK_Return);
         waitUntil("the view's end", [this] { return !desktop_.hasWindow("Best Scores - Quabble"); });

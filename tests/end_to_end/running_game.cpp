@@ -9,9 +9,9 @@
 #include <utility>
 
 #include "../engine/board_notation.hpp"
+#include "../support/files.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/palette.hpp"
-#include "gfx/sprite_sheet.hpp"
 
 namespace quabble {
 namespace {
@@ -25,8 +25,7 @@ constexpr int boardLeft = 232;
 
 RunningGame::RunningGame(Desktop& desktop, std::string program)
     : desktop_(desktop), program_(std::move(program)) {
-    const std::string folder = std::filesystem::path(program_).parent_path().string() + "/";
-    const Surface sheet = loadGraphics(folder).spriteSheet;
+    const Surface sheet = readPicture(std::filesystem::path(program_).parent_path() / "ALLPICDATA.BMP");
     for (int tile = 0; tile < tiles::count; ++tile)
         tiles_.push_back(partOf(sheet, Rect::ofSize(cellSize * tile, 0, cellSize, cellSize)));
 }

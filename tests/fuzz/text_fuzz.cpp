@@ -39,7 +39,7 @@ void requireSound(const TextBox& box) {
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     using namespace quabble;
-    HeadlessFrontEnd frontEnd("");
+    HeadlessFrontEnd frontEnd;
     TextBox box(frontEnd);
     box.font = {Typeface::Sans, 11, false};
     box.area = Rect::ofSize(3, 3, 100, 28);
@@ -64,7 +64,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         }
         requireSound(box);
     }
-    Surface surface(106, 34);
-    box.paint(surface, true);
+    Canvas canvas({106, 34});
+    box.paint(canvas, true);
     return 0;
 }

@@ -1,13 +1,16 @@
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 #include <sys/wait.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <chrono>
 #include <thread>
 
 #include "../support/files.hpp"
 #include "hosts/desktop/detached_process.hpp"
-#include "hosts/desktop/held_keys.hpp"
+#include "hosts/desktop/program_folder.hpp"
+#include "hosts/desktop/x11/held_keys.hpp"
 
 namespace quabble {
 namespace {
@@ -28,6 +31,20 @@ TEST(DetachedProcess, GetsOneArgumentInItsFolderAndLeavesNothingBehind) {
     startDetached({"no-such-program", "x"}, folder.string());
     startDetached({(folder / "tell").string()}, "/no/such/folder");
     EXPECT_TRUE(waitpid(-1, nullptr, WNOHANG) == -1 && errno == ECHILD) << "a child is left to wait for";
+}
+
+TEST(ProgramFolder, HasFilesThatAreReadWholeAndPipesThatAreNotWaitedFor) {
+    const std::filesystem::path folder = programFolder(), pipe = folder / "pipe_of_a_test";
+    const std::string sheet = bytesOf(folder / "ALLPICDATA.BMP");
+    ASSERT_FALSE(sheet.empty());
+    EXPECT_TRUE(std::ranges::equal(readProgramFile("ALLPICDATA.BMP"), std::as_bytes(std::span(sheet))));
+    EXPECT_TRUE(readProgramFile("no such file").empty());
+    std::filesystem::remove(pipe);
+    ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+    EXPECT_TRUE(readProgramFile("pipe_of_a_test").empty());
+    std::filesystem::remove(pipe);
+    EXPECT_EQ(pathOrAddress("QB_HELP.HTM"), folder / "QB_HELP.HTM");
+    EXPECT_EQ(pathOrAddress("https://quabble.example/"), "https://quabble.example/");
 }
 
 TEST(HeldKeys, AKeyHeldSinceAnotherWindowHadTheKeyboardIsNotHeard) {

@@ -20,7 +20,6 @@ class Page final : public Window {
         : Window(loop, owner), log_(log), name_(std::move(name)), dialog_(dialog) {}
 
     std::vector<Step> atNextClick;
-    bool keepsEverything = true;
 
  private:
     // Writes down the end of a handler, also when it does not come to it.
@@ -35,10 +34,6 @@ class Page final : public Window {
     int screen() const override { return screen_; }
     void Form_Load() override { setClientSize({10, 10}); }
     void Form_Unload() override { note("unload"); }
-    bool Form_Terminate() override {
-        note("terminate");
-        return keepsEverything;
-    }
     Task<> Form_MouseDown(float, float) override {
         note("click");
         const Ending ending(*this);
@@ -85,7 +80,6 @@ class Page final : public Window {
 class MessageLoopTest : public testing::Test {
  protected:
     MessageLoopTest() {
-        frontEnd.connect(loop);
         main.show();
         root.start();
     }
@@ -104,9 +98,9 @@ class MessageLoopTest : public testing::Test {
     }
 
     std::string log;
-    HeadlessFrontEnd frontEnd{""};
+    HeadlessFrontEnd frontEnd;
     MessageLoop loop{frontEnd};
-    ScriptedUser user{frontEnd, loop};
+    ScriptedUser<MessageLoop> user{frontEnd, loop};
     Page main{loop, log, "main", nullptr, &dialog};
     Page dialog{loop, log, "dialog", &main, nullptr};
     Timer timer{loop, [this] { return tick(); }};
@@ -174,10 +168,9 @@ TEST_F(MessageLoopTest, EndsHoweverDeepItWaits) {
     click(main, {Step::ShowDialog, Step::Pause});
     user.wait(stepPause);
     click(dialog, {Step::RunMessages, Step::Pause});
-    dialog.keepsEverything = false;
-    EXPECT_FALSE(loop.requestEnd());
+    loop.end();
     click(dialog, {});
-    EXPECT_EQ(logAfter(1h), "main:click main:click dialog:click main:terminate dialog:terminate ");
+    EXPECT_EQ(logAfter(1h), "main:click main:click dialog:click ");
     EXPECT_TRUE(loop.ended());
     EXPECT_FALSE(loop.nextDeadline());
     root.reset();

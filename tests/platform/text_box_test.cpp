@@ -58,7 +58,7 @@ TEST(TextBox, EditsALine) {
         {{"\u00E9\u2122", SelectAll, Cut, Paste, Paste}, "\xE9\x99\xE9\x99", 4, 4, "\u00E9\u2122"},
         {{"a\r\nb\tc\u0085"}, "abc", 3, 3, ""}};
     for (const Case& c : cases) {
-        HeadlessFrontEnd frontEnd("");
+        HeadlessFrontEnd frontEnd;
         TextBox box(frontEnd);
         box.area = Rect::ofSize(0, 0, 200, 28);
         for (const Act& act : c.acts)
@@ -72,8 +72,9 @@ TEST(TextBox, EditsALine) {
 
 // The column of the caret, the one dark line of full height; -1 when it is not to be seen.
 int caretColumn(const TextBox& box) {
-    Surface seen(box.area.right, box.area.bottom);
-    box.paint(seen, true);
+    Canvas canvas({box.area.right, box.area.bottom});
+    box.paint(canvas, true);
+    const Surface& seen = canvas.picture();
     for (int x = 4; x < seen.width() - 4; ++x) {
         bool isCaret = true;
         for (int y = 6; y < seen.height() - 6; ++y)
@@ -90,7 +91,7 @@ void press(TextBox& box, int x, bool withShift) {
 }
 
 TEST(TextBox, KeepsTheCaretOfALongTextInSightAndFollowsTheMouse) {
-    HeadlessFrontEnd frontEnd("");
+    HeadlessFrontEnd frontEnd;
     TextBox box(frontEnd);
     box.font = {Typeface::Sans, 11, false};
     box.area = Rect::ofSize(0, 0, 100, 28);
@@ -124,7 +125,7 @@ TEST(TextBox, KeepsTheCaretOfALongTextInSightAndFollowsTheMouse) {
 }
 
 TEST(TextBox, LeavesOutWhatItCannotHold) {
-    HeadlessFrontEnd frontEnd("");
+    HeadlessFrontEnd frontEnd;
     TextBox box(frontEnd);
     box.textInput("0123456789");
     for (int i = 0; i < 40; ++i) {
@@ -139,7 +140,7 @@ TEST(TextBox, LeavesOutWhatItCannotHold) {
 }
 
 TEST(TextBox, MarksWhatIsSelected) {
-    HeadlessFrontEnd frontEnd("");
+    HeadlessFrontEnd frontEnd;
     TextBox box(frontEnd);
     box.font = {Typeface::Sans, 11, false};
     box.area = Rect::ofSize(0, 0, 100, 28);
@@ -148,8 +149,9 @@ TEST(TextBox, MarksWhatIsSelected) {
     const int end = caretColumn(box);
     press(box, 30, true);
     const int start = caretColumn(box);
-    Surface seen(100, 28);
-    box.paint(seen, false);
+    Canvas canvas({100, 28});
+    box.paint(canvas, false);
+    const Surface& seen = canvas.picture();
     for (int x = 6; x < 94; ++x)
         EXPECT_EQ(seen.at(x, 6) != seen.at(95, 6), x >= start && x < end) << x;
     EXPECT_TRUE(start > 20 && start < 40 && end > 50 && end < 70);

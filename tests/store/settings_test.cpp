@@ -1,14 +1,58 @@
-#include "store_fixture.hpp"
+#include <gtest/gtest.h>
+
+#include "hosts/headless/memory_blob.hpp"
+#include "store/settings_store.hpp"
 
 namespace quabble {
 namespace {
 
-class SettingsTest : public StoreFixture {};
+// What a run of the program has in memory of what is kept.
+struct Kept {
+    Settings settings;
+    HighScores highScores;
+
+    StoreResult load(RegistryStore& registry) {
+        return SettingsStore(registry).loadSettings(settings, highScores);
+    }
+    StoreResult save(RegistryStore& registry) {
+        return SettingsStore(registry).saveSettings(settings, highScores);
+    }
+    HighScoreTable& table(std::int16_t number) { return highScores.table(number); }
+};
+
+class SettingsTest : public testing::Test {
+ protected:
+    static constexpr const char* key = R"(Software\Vorlane\Quabble\1.0)";
+
+    void set(const std::string& name, std::string_view hex) {
+        std::vector<std::byte> bytes;
+        for (; !hex.empty(); hex.remove_prefix(2))
+            bytes.push_back(static_cast<std::byte>(std::stoi(std::string(hex.substr(0, 2)), nullptr, 16)));
+        const auto transaction = registry.begin(Access::Write);
+        transaction->createKey(key, "");
+        transaction->set(key, name, ValueType::Binary, bytes);
+        transaction->commit();
+    }
+    // The type and the bytes of a value; empty when there is none.
+    std::string stored(const std::string& name) {
+        const auto value = registry.begin(Access::Read)->query(key, name);
+        std::string text = value ? std::to_string(static_cast<int>(value->type)) + ":" : "";
+        for (std::size_t i = 0; value && i < value->data.size(); ++i) {
+            constexpr const char* digits = "0123456789ABCDEF";
+            const auto byte = std::to_integer<unsigned>(value->data[i]);
+            text += {digits[byte / 16], digits[byte % 16]};
+        }
+        return text;
+    }
+
+    MemoryBlob blob;
+    BlobRegistryStore registry{blob};
+};
 
 TEST_F(SettingsTest, AFreshStoreHasItsDefaults) {
     Kept kept;
     EXPECT_EQ(kept.load(registry), StoreResult::Done);
-    EXPECT_EQ(sql("SELECT count(*) FROM sqlite_schema"), "0\n") << "who reads writes nothing";
+    EXPECT_TRUE(blob.bytes.empty()) << "who reads writes nothing";
     for (std::int16_t table = 1; table <= 3; ++table) {
         for (std::size_t place = 0; place < 8; ++place) {
             EXPECT_EQ(kept.table(table).names[place], "Anononymous");
@@ -35,15 +79,14 @@ TEST_F(SettingsTest, EveryByteComesBackAsItWasStored) {
     EXPECT_EQ(kept.table(2).names[4], "Zo\xEB \x80");
     kept.settings.solvingData.setScoreTableIndex(3);
     kept.settings.solvingData.setSplashSeen();
-    sql("DELETE FROM entries");
+    blob.bytes.clear();
     kept.save(registry);
-    EXPECT_EQ(stored("SOLVINGDATA"), "00110300010066778899AABBCCDD\n");
-    EXPECT_EQ(stored("NUMWFSF"), "DEADBEEF\n");
-    EXPECT_EQ(stored("SOUNDOPTIONS"), "0000FFFF01000000000000000280\n");
-    EXPECT_EQ(stored("2STATS"), "0F270000FFFFFFFF03000000020000000100000000000000FEFFFFFF00000080\n");
-    EXPECT_EQ(stored("2STATS5"), "5A6FEB208000\n");
-    EXPECT_EQ(sql("SELECT type FROM entries WHERE name IN ('NUMWFSF', '2STATS5') ORDER BY name"), "1\n3\n");
-    EXPECT_EQ(sql("SELECT count(*) FROM entries"), "30\n");
+    EXPECT_EQ(stored("SOLVINGDATA"), "3:00110300010066778899AABBCCDD");
+    EXPECT_EQ(stored("NUMWFSF"), "3:DEADBEEF");
+    EXPECT_EQ(stored("SOUNDOPTIONS"), "3:0000FFFF01000000000000000280");
+    EXPECT_EQ(stored("2STATS"), "3:0F270000FFFFFFFF03000000020000000100000000000000FEFFFFFF00000080");
+    EXPECT_EQ(stored("2STATS5"), "1:5A6FEB208000");
+    EXPECT_EQ(stored("1STATS9") + stored("4STATS"), "");
 }
 
 TEST_F(SettingsTest, OneBadValueCostsNoOther) {
@@ -54,20 +97,16 @@ TEST_F(SettingsTest, OneBadValueCostsNoOther) {
     };
     const std::string of24 = "abcdefghijklmnopqrstuvwx";
     const std::string hexOf24 = "6162636465666768696A6B6C6D6E6F707172737475767778";
-    const Case cases[] = {{"missing", "1STATS3", "", "Anononymous", 0},
-                          {"24 bytes", "1STATS3", hexOf24 + "00", of24, 30},
+    const Case cases[] = {{"24 bytes", "1STATS3", hexOf24 + "00", of24, 30},
                           {"25 bytes", "1STATS3", hexOf24 + "7900", "Anononymous", 0},
-                          {"no bytes at all", "1STATS3", "EMPTY", "", 30},
+                          {"no bytes at all", "1STATS3", "", "", 30},
                           {"scores of another size", "1STATS", std::string(66, '1'), "third", 0}};
     for (const Case& c : cases) {
-        std::filesystem::remove_all(file);
+        blob.bytes.clear();
         Kept written;
         written.table(1) = {{10, 20, 30, 40, 50, 60, 70, 80}, {"a", "b", "third", "d", "e", "f", "g", "h"}};
         written.save(registry);
-        if (c.value.empty())
-            sql("DELETE FROM entries WHERE name = '" + c.entry + "'");
-        else
-            set(c.entry, c.value == "EMPTY" ? "" : c.value);
+        set(c.entry, c.value);
         Kept kept;
         kept.load(registry);
         EXPECT_EQ(kept.table(1).names[2], c.expectedName) << c.name;
@@ -85,21 +124,32 @@ TEST_F(SettingsTest, OneBadValueCostsNoOther) {
     }
 }
 
-// The file was written by another program, as the first version leaves it on its users' disks.
-TEST_F(SettingsTest, AStoreOfTheFirstVersionLoadsAndIsKeptUp) {
-    std::filesystem::create_directories(file.parent_path());
-    std::filesystem::copy_file(QUABBLE_GOLDEN_STORE, file);
+TEST_F(SettingsTest, AMissingNameCostsItsScore) {
+    set("1STATS", "0A00000014000000");
+    set("1STATS1", "6100");
     Kept kept;
-    EXPECT_EQ(kept.load(registry), StoreResult::Done);
-    EXPECT_EQ(kept.settings.solvingData.scoreTableIndex(), 2);
-    EXPECT_EQ(kept.settings.soundOptions, (std::array<std::int16_t, 7>{1, 1, 0, 1, 1, 1, 1}));
-    EXPECT_TRUE(kept.table(3).names[7].starts_with("Zo\xEB \x80"));
-    EXPECT_EQ(kept.table(3).scores[7], 30035);
-    kept.table(3).scores[7] = 30036;
-    kept.save(registry);
-    EXPECT_EQ(stored("3STATS").substr(56), "54750000\n");
-    EXPECT_EQ(sql("SELECT count(*) FROM entries"), "30\n");
-    EXPECT_EQ(sql("SELECT group_concat(class, '/') FROM keys"), "///USERDATA\n");
+    kept.load(registry);
+    EXPECT_EQ(kept.table(1).names[0], "a");
+    EXPECT_EQ(kept.table(1).scores[0], 10);
+    EXPECT_EQ(kept.table(1).names[1], "Anononymous");
+    EXPECT_EQ(kept.table(1).scores[1], 0);
+}
+
+// Nobody is to overwrite what he has never read.
+TEST_F(SettingsTest, ARegistryThatCouldNotBeOpenedIsLeftAlone) {
+    Kept first;
+    first.table(1).names[0] = "first";
+    first.save(registry);
+    const auto sound = blob.bytes;
+    Kept kept;
+    SettingsStore store(registry);
+    blob.bytes.resize(50);
+    EXPECT_EQ(store.loadSettings(kept.settings, kept.highScores), StoreResult::NotOpened);
+    EXPECT_EQ(kept.table(1).names[0] + kept.table(3).names[7], "") << "everything is as it was";
+    EXPECT_EQ(kept.settings.soundOptions[0], 0);
+    blob.bytes = sound;
+    EXPECT_EQ(store.saveSettings(kept.settings, kept.highScores), StoreResult::NotOpened);
+    EXPECT_EQ(blob.bytes, sound);
 }
 
 }  // namespace

@@ -4,8 +4,13 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <map>
+#include <span>
 #include <stdexcept>
 #include <string>
+#include <vector>
+
+#include "draw/bitmap_file.hpp"
 
 namespace quabble {
 
@@ -30,6 +35,24 @@ inline std::string bytesOf(const std::filesystem::path& file) {
         return {};
     std::ifstream stream(file, std::ios::binary);
     return {std::istreambuf_iterator<char>(stream), {}};
+}
+
+// A 24-bit BMP file; empty when it is none.
+inline Surface readPicture(const std::filesystem::path& file) {
+    const std::string bytes = bytesOf(file);
+    return decodeBitmap(std::as_bytes(std::span(bytes))).value_or(Surface());
+}
+
+// The pictures that a built program lies beside, as a machine without a screen takes its files.
+inline std::map<std::string, std::vector<std::byte>, std::less<>> picturesIn(
+    const std::filesystem::path& folder) {
+    std::map<std::string, std::vector<std::byte>, std::less<>> pictures;
+    for (const char* name : {"ALLPICDATA.BMP", "BGIMG.BMP"}) {
+        const std::string file = bytesOf(folder / name);
+        const auto bytes = std::as_bytes(std::span(file));
+        pictures[name].assign(bytes.begin(), bytes.end());
+    }
+    return pictures;
 }
 
 }  // namespace quabble

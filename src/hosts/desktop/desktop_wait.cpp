@@ -5,7 +5,7 @@
 
 #include <algorithm>
 
-#include "hosts/desktop/x11_window.hpp"
+#include "hosts/desktop/x11/x11_window.hpp"
 
 namespace quabble {
 

@@ -7,9 +7,9 @@
 #include <vector>
 
 #include "base/round_half_even.hpp"
-#include "hosts/desktop/icon.hpp"
-#include "hosts/desktop/refused_drops.hpp"
-#include "hosts/desktop/x11_window.hpp"
+#include "hosts/desktop/x11/icon.hpp"
+#include "hosts/desktop/x11/refused_drops.hpp"
+#include "hosts/desktop/x11/x11_window.hpp"
 #include "platform/window.hpp"
 
 namespace quabble {

@@ -5,7 +5,7 @@
 #include <span>
 
 #include "draw/scaling.hpp"
-#include "hosts/desktop/shared_picture.hpp"
+#include "hosts/desktop/x11/shared_picture.hpp"
 #include "platform/front_end.hpp"
 
 struct SDL_Window;

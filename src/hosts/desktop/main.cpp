@@ -5,6 +5,8 @@
 #include <string>
 
 #include "app/program.hpp"
+#include "hosts/desktop/registry/registry_file.hpp"
+#include "hosts/desktop/registry/sqlite_registry.hpp"
 #include "hosts/desktop/sdl_front_end.hpp"
 
 int main() {
@@ -17,11 +19,8 @@ int main() {
         return EXIT_FAILURE;
     }
     const auto clock = std::chrono::system_clock::now().time_since_epoch().count();
-    quabble::MessageLoop loop(*frontEnd);
-    quabble::Registry registry(quabble::userRegistryPath("quabble"));
-    quabble::AppState app(loop, registry, static_cast<std::uint64_t>(clock));
-    quabble::Task<> program = quabble::runProgram(app);
-    program.start();
-    frontEnd->run(loop);
+    quabble::SqliteRegistryStore registry(quabble::userRegistryPath("quabble"));
+    quabble::Program program(*frontEnd, registry, static_cast<std::uint64_t>(clock));
+    frontEnd->run(program);
     return EXIT_SUCCESS;
 }

@@ -6,13 +6,12 @@
 #include <csignal>
 #include <cstdio>
 #include <cstring>
-#include <filesystem>
 #include <utility>
 
 #include "hosts/desktop/detached_process.hpp"
+#include "hosts/desktop/program_folder.hpp"
 #include "hosts/desktop/sdl_events.hpp"
-#include "hosts/desktop/x11_window.hpp"
-#include "platform/window.hpp"
+#include "hosts/desktop/x11/x11_window.hpp"
 
 namespace quabble {
 namespace {
@@ -37,8 +36,8 @@ std::string whyUnusable() {
     return {};
 }
 
-void end(MessageLoop& loop) {
-    if (!loop.requestEnd())
+void end(Program& program) {
+    if (!program.requestEnd())
         std::fputs("Quabble could not save its settings and high scores.\n", stderr);
 }
 
@@ -84,47 +83,47 @@ SdlFrontEnd::~SdlFrontEnd() {
     SDL_Quit();
 }
 
-void SdlFrontEnd::run(MessageLoop& loop) {
-    loop.wake();
+void SdlFrontEnd::run(Program& program) {
+    program.start();
     // The program then ends as it would when asked to, but has no windows any more to close.
-    X11Window::whenServerGoes([this, &loop] {
+    X11Window::whenServerGoes([this, &program] {
         static decltype(windows_) abandoned;
         abandoned.swap(windows_);
-        end(loop);
+        end(program);
     });
-    while (!loop.ended()) {
-        waitForEvents(loop);
-        loop.wake();
+    while (!program.ended()) {
+        waitForEvents(program);
+        program.wake();
     }
     X11Window::whenServerGoes([] {});
 }
 
 // Blocks until something has happened or the program's wait is over, then posts all that has happened.
-void SdlFrontEnd::waitForEvents(MessageLoop& loop) {
+void SdlFrontEnd::waitForEvents(Program& program) {
     for (const WindowId window : std::exchange(unopened_, {}))
-        loop.post({.window = window, .kind = EventKind::CloseButton});
+        program.post({.window = window, .kind = EventKind::CloseButton});
     if (SDL_PollEvent(nullptr) == 0)
-        desktopWait_.sleep(windows_.empty() ? nullptr : windows_.begin()->second->sdl(), timeLeft(loop));
+        desktopWait_.sleep(windows_.empty() ? nullptr : windows_.begin()->second->sdl(), timeLeft(program));
     SDL_Event event;
     while (SDL_PollEvent(&event) != 0) {
         if (event.type == SDL_QUIT) {
-            end(loop);
+            end(program);
             return;
         }
-        take(event, loop);
+        take(event, program);
     }
 }
 
-std::optional<Clock::duration> SdlFrontEnd::timeLeft(const MessageLoop& loop) {
-    const auto deadline = loop.nextDeadline();
+std::optional<Clock::duration> SdlFrontEnd::timeLeft(const Program& program) {
+    const auto deadline = program.nextDeadline();
     if (!deadline)
         return std::nullopt;
     return std::max(*deadline - now(), Clock::duration::zero());
 }
 
-void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
+void SdlFrontEnd::take(const SDL_Event& event, Program& program) {
     if (const auto reported = translateX11(event)) {
-        take(*reported, loop);
+        take(*reported, program);
         return;
     }
     const WindowId window = idOf(windowOf(event));
@@ -136,7 +135,7 @@ void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
     }
     if (event.type == SDL_WINDOWEVENT &&
         (event.window.event == SDL_WINDOWEVENT_FOCUS_GAINED || event.window.event == SDL_WINDOWEVENT_SHOWN))
-        handOnKeyboard(loop);
+        handOnKeyboard(program);
     if (event.type == SDL_WINDOWEVENT && event.window.event == SDL_WINDOWEVENT_ENTER && shown != nullptr)
         showPointerOf(*shown);
     const bool isTyped = event.type == SDL_KEYDOWN || event.type == SDL_TEXTINPUT;
@@ -150,19 +149,19 @@ void SdlFrontEnd::take(const SDL_Event& event, MessageLoop& loop) {
         input->x = static_cast<float>(place.x);
         input->y = static_cast<float>(place.y);
     }
-    loop.post(*input);
+    program.post(*input);
 }
 
 // While a dialog is open the keyboard is the innermost one's, whichever of the program's windows the desktop
 // has given it to.
-void SdlFrontEnd::handOnKeyboard(const MessageLoop& loop) {
-    const DesktopWindow* dialog = loop.modalWindow() == nullptr ? nullptr : find(loop.modalWindow()->id());
+void SdlFrontEnd::handOnKeyboard(const Program& program) {
+    const DesktopWindow* dialog = find(program.modalWindow().value_or(WindowId::none));
     const SDL_Window* focused = SDL_GetKeyboardFocus();
     if (dialog != nullptr && focused != nullptr && focused != dialog->sdl())
         dialog->takeKeyboard();
 }
 
-void SdlFrontEnd::take(const X11Event& event, MessageLoop& loop) {
+void SdlFrontEnd::take(const X11Event& event, Program& program) {
     switch (event.kind) {
         case X11Event::Kind::KeyboardGained:
             heldKeys_.changeWindow();
@@ -178,20 +177,19 @@ void SdlFrontEnd::take(const X11Event& event, MessageLoop& loop) {
             break;
         case X11Event::Kind::WindowDestroyed:
             if (const WindowId window = idOfX11(event.window); window != WindowId::none)
-                lose(window, loop);
+                lose(window, program);
             break;
     }
 }
 
 // Somebody else has destroyed a window. For a dialog that is closing it; without its main window the program
 // ends.
-void SdlFrontEnd::lose(WindowId window, MessageLoop& loop) {
+void SdlFrontEnd::lose(WindowId window, Program& program) {
     windows_.at(window)->setLost();
-    const Window* modal = loop.modalWindow();
-    if (modal != nullptr && modal->id() == window)
-        loop.post({.window = window, .kind = EventKind::CloseButton});
+    if (program.modalWindow() == window)
+        program.post({.window = window, .kind = EventKind::CloseButton});
     else
-        end(loop);
+        end(program);
 }
 
 void SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
@@ -235,8 +233,8 @@ void SdlFrontEnd::showPointerOf(const DesktopWindow& window) {
     SDL_SetCursor(isHand && hand_ != nullptr ? hand_ : SDL_GetDefaultCursor());
 }
 
-void SdlFrontEnd::openDocument(const std::string& document, const std::string& folder) {
-    startDetached({"xdg-open", document}, folder);
+void SdlFrontEnd::openDocument(std::string_view document) {
+    startDetached({"xdg-open", pathOrAddress(document)}, programFolder());
 }
 
 void SdlFrontEnd::setTextInput(WindowId window, std::optional<Rect> area) {
@@ -270,9 +268,8 @@ Size SdlFrontEnd::screenSize() {
     return {bounds.w, bounds.h};
 }
 
-std::string SdlFrontEnd::executableFolder() {
-    std::error_code unknown;
-    return std::filesystem::read_symlink("/proc/self/exe", unknown).parent_path().string();
+std::vector<std::byte> SdlFrontEnd::programFile(std::string_view name) {
+    return readProgramFile(name);
 }
 
 DesktopWindow* SdlFrontEnd::find(WindowId window) {

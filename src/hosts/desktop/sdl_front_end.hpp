@@ -4,14 +4,15 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
+#include "app/program.hpp"
 #include "hosts/desktop/desktop_wait.hpp"
 #include "hosts/desktop/desktop_window.hpp"
-#include "hosts/desktop/held_keys.hpp"
-#include "hosts/desktop/x11_events.hpp"
+#include "hosts/desktop/x11/held_keys.hpp"
+#include "hosts/desktop/x11/x11_events.hpp"
 #include "platform/front_end.hpp"
-#include "platform/message_loop.hpp"
 
 struct SDL_Cursor;
 union SDL_Event;
@@ -27,8 +28,8 @@ class SdlFrontEnd final : public FrontEnd {
     SdlFrontEnd(const SdlFrontEnd&) = delete;
     SdlFrontEnd& operator=(const SdlFrontEnd&) = delete;
 
-    // Waits for the desktop's events and passes them to the loop until the program has ended.
-    void run(MessageLoop& loop);
+    // Starts the program, waits for the desktop's events and passes them on, until the program has ended.
+    void run(Program& program);
 
     TimePoint now() override { return Clock::now(); }
     void createWindow(WindowId window, const NativeWindow& traits) override;
@@ -36,25 +37,25 @@ class SdlFrontEnd final : public FrontEnd {
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
     void setPointer(WindowId window, PointerShape shape) override;
-    void openDocument(const std::string& document, const std::string& folder) override;
+    void openDocument(std::string_view document) override;
     void setTextInput(WindowId window, std::optional<Rect> area) override;
     std::string clipboardText() override;
     void setClipboardText(const std::string& text) override;
     Size screenSize() override;
-    std::string executableFolder() override;
+    std::vector<std::byte> programFile(std::string_view name) override;
 
  private:
     SdlFrontEnd() = default;
     DesktopWindow* find(WindowId window);
     WindowId idOf(std::uint32_t sdlWindow) const;
     WindowId idOfX11(unsigned long x11Window) const;
-    void waitForEvents(MessageLoop& loop);
-    std::optional<Clock::duration> timeLeft(const MessageLoop& loop);
-    void take(const SDL_Event& event, MessageLoop& loop);
+    void waitForEvents(Program& program);
+    std::optional<Clock::duration> timeLeft(const Program& program);
+    void take(const SDL_Event& event, Program& program);
     void showPointerOf(const DesktopWindow& window);
-    void handOnKeyboard(const MessageLoop& loop);
-    void take(const X11Event& event, MessageLoop& loop);
-    void lose(WindowId window, MessageLoop& loop);
+    void handOnKeyboard(const Program& program);
+    void take(const X11Event& event, Program& program);
+    void lose(WindowId window, Program& program);
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
     std::vector<WindowId> unopened_;  // for want of a place on the desktop; they close at once

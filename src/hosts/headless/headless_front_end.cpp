@@ -7,30 +7,24 @@ void HeadlessFrontEnd::createWindow(WindowId window, const NativeWindow& traits)
 }
 
 void HeadlessFrontEnd::showPixels(WindowId window, const Surface& picture) {
-    const auto shown = windows_.find(window);
-    if (shown == windows_.end())
-        return;
-    shown->second.picture = picture;
-    ++shown->second.timesShown;
-}
-
-void HeadlessFrontEnd::closeWindow(WindowId window) {
-    windows_.erase(window);
+    Shown& shown = windows_.at(window);
+    shown.picture = picture;
+    ++shown.timesShown;
 }
 
 void HeadlessFrontEnd::minimiseWindow(WindowId window) {
     windows_.at(window).minimised = true;
-    loop_->post({.window = window, .kind = EventKind::Minimised});
-}
-
-void HeadlessFrontEnd::setTextInput(WindowId window, std::optional<Rect> area) {
-    if (const auto shown = windows_.find(window); shown != windows_.end())
-        shown->second.takesText = area.has_value();
+    post_({.window = window, .kind = EventKind::Minimised});
 }
 
 void HeadlessFrontEnd::restoreWindow(WindowId window) {
     windows_.at(window).minimised = false;
-    loop_->post({.window = window, .kind = EventKind::Restored});
+    post_({.window = window, .kind = EventKind::Restored});
+}
+
+std::vector<std::byte> HeadlessFrontEnd::programFile(std::string_view name) {
+    const auto file = files_.find(name);
+    return file == files_.end() ? std::vector<std::byte>() : file->second;
 }
 
 }  // namespace quabble

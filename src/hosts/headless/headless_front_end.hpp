@@ -1,16 +1,18 @@
 #pragma once
 
+#include <algorithm>
+#include <functional>
 #include <map>
 #include <string>
 #include <utility>
 #include <vector>
 
 #include "platform/front_end.hpp"
-#include "platform/message_loop.hpp"
+#include "platform/input_event.hpp"
 
 namespace quabble {
 
-// A machine without a screen: windows are pictures in memory and time passes when told to.
+// A machine without a screen: windows are pictures in memory, files too, and time passes when told to.
 class HeadlessFrontEnd final : public FrontEnd {
  public:
     struct Shown {
@@ -21,28 +23,30 @@ class HeadlessFrontEnd final : public FrontEnd {
         bool takesText = false;
         PointerShape pointer = PointerShape::Arrow;
     };
+    using Files = std::map<std::string, std::vector<std::byte>, std::less<>>;
 
-    explicit HeadlessFrontEnd(std::string folder) : executableFolder_(std::move(folder)) {}
+    // The files that come with the program.
+    explicit HeadlessFrontEnd(Files files = {}) : files_(std::move(files)) {}
 
-    // The loop that hears about windows being minimised; it must be set before a window is.
-    void connect(MessageLoop& loop) { loop_ = &loop; }
+    // Where the program is posted what happens; to be set before a window is minimised or restored.
+    void connect(std::function<void(const InputEvent&)> post) { post_ = std::move(post); }
 
     TimePoint now() override { return now_; }
     void createWindow(WindowId window, const NativeWindow& traits) override;
     void showPixels(WindowId window, const Surface& picture) override;
-    void closeWindow(WindowId window) override;
+    void closeWindow(WindowId window) override { windows_.erase(window); }
     void minimiseWindow(WindowId window) override;
     void setPointer(WindowId window, PointerShape shape) override { windows_.at(window).pointer = shape; }
-    void openDocument(const std::string& document, const std::string& folder) override {
-        openedDocuments.push_back(document + " in " + folder);
+    void setTextInput(WindowId window, std::optional<Rect> area) override {
+        windows_.at(window).takesText = area.has_value();
     }
-    void setTextInput(WindowId window, std::optional<Rect> area) override;
+    std::vector<std::byte> programFile(std::string_view name) override;
+    void openDocument(std::string_view document) override { openedDocuments.emplace_back(document); }
     std::string clipboardText() override { return clipboard; }
     void setClipboardText(const std::string& text) override { clipboard = text; }
-    std::string executableFolder() override { return executableFolder_; }
 
-    std::vector<std::string> openedDocuments;  // "document in folder"
-    std::string clipboard;                     // UTF-8
+    std::vector<std::string> openedDocuments;
+    std::string clipboard;  // UTF-8
 
     void advanceTo(TimePoint time) { now_ = std::max(now_, time); }
     void restoreWindow(WindowId window);
@@ -51,8 +55,8 @@ class HeadlessFrontEnd final : public FrontEnd {
     const std::map<WindowId, Shown>& windows() const { return windows_; }
 
  private:
-    MessageLoop* loop_ = nullptr;
-    std::string executableFolder_;
+    Files files_;
+    std::function<void(const InputEvent&)> post_;
     TimePoint now_;
     std::map<WindowId, Shown> windows_;
 };

@@ -1,4 +1,4 @@
-#include "hosts/desktop/held_keys.hpp"
+#include "hosts/desktop/x11/held_keys.hpp"
 
 #include <utility>
 

@@ -4,7 +4,7 @@
 #include <optional>
 #include <span>
 
-#include "hosts/desktop/icon.hpp"
+#include "hosts/desktop/x11/icon.hpp"
 
 struct SDL_Window;
 struct _XDisplay;

@@ -1,4 +1,4 @@
-#include "hosts/desktop/icon.hpp"
+#include "hosts/desktop/x11/icon.hpp"
 
 #include <cstddef>
 

@@ -1,4 +1,4 @@
-#include "hosts/desktop/x11_window.hpp"
+#include "hosts/desktop/x11/x11_window.hpp"
 
 #include <SDL2/SDL.h>
 #include <SDL2/SDL_syswm.h>

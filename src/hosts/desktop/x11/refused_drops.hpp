@@ -1,6 +1,6 @@
 #pragma once
 
-#include "hosts/desktop/x11_window.hpp"
+#include "hosts/desktop/x11/x11_window.hpp"
 
 namespace quabble {
 

@@ -1,4 +1,4 @@
-#include "hosts/desktop/refused_drops.hpp"
+#include "hosts/desktop/x11/refused_drops.hpp"
 
 #include <X11/Xlibint.h>  // its macros named min and max are no trouble to <cassert>
 

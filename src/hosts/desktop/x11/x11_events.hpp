@@ -4,7 +4,7 @@
 
 #include <optional>
 
-#include "hosts/desktop/held_keys.hpp"
+#include "hosts/desktop/x11/held_keys.hpp"
 
 namespace quabble {
 

@@ -3,7 +3,7 @@
 
 #include <functional>
 
-#include "store_fixture.hpp"
+#include "sqlite_fixture.hpp"
 
 namespace quabble {
 namespace {
@@ -85,7 +85,7 @@ void injectFaults() {
     sqlite3_vfs_register(&vfs, 1);
 }
 
-class CrashTest : public StoreFixture {
+class CrashTest : public SqliteFixture {
  protected:
     // Everything that is kept says the same number, which is 0 in a new store.
     static void fill(Kept& kept, std::int16_t number) {

@@ -8,6 +8,7 @@
 #include <string>
 
 #include "../support/files.hpp"
+#include "hosts/desktop/registry/sqlite_registry.hpp"
 #include "store/settings_store.hpp"
 
 namespace quabble {
@@ -17,13 +18,17 @@ struct Kept {
     Settings settings;
     HighScores highScores;
 
-    StoreResult load(Registry& registry) { return loadSettings(settings, highScores, registry); }
-    StoreResult save(Registry& registry) { return saveSettings(settings, highScores, registry); }
+    StoreResult load(RegistryStore& registry) {
+        return SettingsStore(registry).loadSettings(settings, highScores);
+    }
+    StoreResult save(RegistryStore& registry) {
+        return SettingsStore(registry).saveSettings(settings, highScores);
+    }
     HighScoreTable& table(std::int16_t number) { return highScores.table(number); }
 };
 
 // A folder of its own for each test, and a look into the file that is independent of the registry.
-class StoreFixture : public ::testing::Test {
+class SqliteFixture : public ::testing::Test {
  protected:
     // Runs SQL on the file; the first column of what it returns, in hexadecimal, a line a row.
     std::string sql(const std::string& statements) const {
@@ -39,10 +44,6 @@ class StoreFixture : public ::testing::Test {
         EXPECT_EQ(problem, nullptr) << problem;
         sqlite3_close(database);
         return rows;
-    }
-    void set(const std::string& name, const std::string& hex) const {
-        sql("INSERT OR REPLACE INTO entries VALUES ('software\\vorlane\\QUABBLE\\1.0', '" + name +
-            "', 3, x'" + hex + "')");
     }
     std::string stored(const std::string& name) const {
         return sql("SELECT hex(data) FROM entries WHERE name = '" + name + "'");
@@ -62,7 +63,7 @@ class StoreFixture : public ::testing::Test {
     const TemporaryFolder temporary;
     const std::filesystem::path& folder = temporary.path;
     const std::filesystem::path file = folder / "data" / "quabble" / "registry.db";
-    Registry registry{file.string()};
+    SqliteRegistryStore registry{file.string()};
 };
 
 }  // namespace quabble

@@ -4,7 +4,7 @@
 
 #include "draw/scaling.hpp"
 #include "draw/surface.hpp"
-#include "hosts/desktop/x11_window.hpp"
+#include "hosts/desktop/x11/x11_window.hpp"
 
 namespace quabble {
 

@@ -1,4 +1,4 @@
-#include "hosts/desktop/shared_picture.hpp"
+#include "hosts/desktop/x11/shared_picture.hpp"
 
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>

@@ -1,4 +1,4 @@
-#include "hosts/desktop/x11_events.hpp"
+#include "hosts/desktop/x11/x11_events.hpp"
 
 #include <SDL2/SDL_syswm.h>
 

@@ -1,0 +1,61 @@
+#include "app/button_panel.hpp"
+
+#include <algorithm>
+#include <string>
+
+#include "gfx/painters.hpp"
+#include "gfx/string_table.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr std::int32_t labelShadow = 2;
+constexpr std::int32_t hoveredShadow = 6;
+constexpr std::int32_t leftShadow = 3;  // of a button that the pointer has left
+
+}  // namespace
+
+std::string_view ButtonPanel::captionOf(std::size_t box) const {
+    return loadString(static_cast<std::uint16_t>(captionBase_ + box + 1));
+}
+
+void ButtonPanel::draw(Canvas& canvas) const {
+    for (std::size_t i = 0; i < boxes_.size(); ++i) {
+        const bool isButton = boxes_[i].active == BoxKind::Button;
+        if (boxes_[i].active != BoxKind::ValueBox)
+            drawLabelledBox(canvas, boxes_[i], BoxStyle::Plain, false,
+                            isButton ? restingShadow_ : labelShadow, captionOf(i));
+    }
+}
+
+void ButtonPanel::drawValue(Canvas& canvas, std::size_t box, std::int32_t value, bool highlighted) const {
+    drawLabelledBox(canvas, boxes_[box], BoxStyle::Plain, highlighted, labelShadow, std::to_string(value));
+}
+
+std::optional<std::size_t> ButtonPanel::buttonAt(float x, float y) const {
+    std::size_t number = 0;
+    for (const ScreenButton& box : boxes_) {
+        if (box.active != BoxKind::Button)
+            continue;
+        if (hitTest(box, x, y))
+            return number;
+        ++number;
+    }
+    return std::nullopt;
+}
+
+bool ButtonPanel::highlightNext(Canvas& canvas, float x, float y) {
+    const auto isWrong = [&](const ScreenButton& box) {
+        return box.active == BoxKind::Button && box.hovered != hitTest(box, x, y);
+    };
+    const auto button = std::ranges::find_if(boxes_, isWrong);
+    if (button == boxes_.end())
+        return false;
+    button->hovered = !button->hovered;
+    drawLabelledBox(canvas, *button, button->hovered ? BoxStyle::Framed : BoxStyle::Plain, button->hovered,
+                    button->hovered ? hoveredShadow : leftShadow,
+                    captionOf(static_cast<std::size_t>(button - boxes_.begin())));
+    return true;
+}
+
+}  // namespace quabble

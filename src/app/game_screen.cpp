@@ -1,0 +1,164 @@
+#include "app/game_screen.hpp"
+
+#include <utility>
+
+#include "app/layout.hpp"
+#include "gfx/painters.hpp"
+#include "gfx/string_table.hpp"
+
+namespace quabble {
+namespace {
+
+constexpr Font pointsFont{Typeface::SansBold, 8};
+constexpr std::int32_t buttonShadow = 6;
+
+}  // namespace
+
+GameScreen::GameScreen(MessageLoop& loop, Window& window, AppState& app, Handlers handlers)
+    : loop_(loop),
+      window_(window),
+      app_(app),
+      handlers_(std::move(handlers)),
+      timerBlocks_(loop, handlers_.blockTimerTick),
+      diagWow_(loop, window, app.game, layoutUnit),
+      diagUN_(loop, window),
+      frmStats_(loop, window, app.highScores, layoutUnit),
+      standardBtns_(layout::initStandardBtns(), string_ids::classicPanelBase, buttonShadow),
+      arcadeBtns_(layout::initArcadeBtns(), string_ids::arcadePanelBase, buttonShadow) {}
+
+void GameScreen::setPaused(bool paused) {
+    gamePaused_ = paused;
+    switchBlockTimer(app_.game.arcadeActive && app_.game.gameMode == GameMode::Timed);
+}
+
+std::optional<PanelButton> GameScreen::buttonAt(float x, float y) const {
+    const auto button = panel().buttonAt(x, y);
+    return button ? std::optional(static_cast<PanelButton>(*button)) : std::nullopt;
+}
+
+bool GameScreen::isOnPreview(float x, float y) const {
+    const Rect strip{previewBox_.left, previewBox_.top, previewBox_.cell(12, 0).left,
+                     previewBox_.cell(0, 1).top};
+    return app_.game.arcadeActive && hitTest(strip, x, y);
+}
+
+void GameScreen::highlightUnderPointer(float x, float y) {
+    ButtonPanel& panel = app_.game.classicActive ? standardBtns_ : arcadeBtns_;
+    while (panel.highlightNext(window_.canvas(), x, y))
+        window_.refresh();
+}
+
+BoardArea GameScreen::layOutClassic() {
+    return layOutOn(layout::classicPlayPanel());
+}
+
+BoardArea GameScreen::layOutArcade() {
+    const BoardArea area = layOutOn(layout::arcadePlayPanel());
+    previewBox_ = layout::preview(boardBox_);
+    gaugeBox_ = layout::gauge(playPanelBox_, boardBox_);
+    return area;
+}
+
+BoardArea GameScreen::layOutOn(const Rect& playPanel) {
+    playPanelBox_ = playPanel;
+    boardBox_ = layout::board(playPanel);
+    return {boardBox_.left, boardBox_.top, boardBox_.cellSize};
+}
+
+void GameScreen::clearWindow() {
+    window_.canvas().fill(window_.canvas().bounds(), palette::backgroundColour);
+}
+
+void GameScreen::drawClassicPanel() {
+    drawPanel(standardBtns_);
+}
+
+void GameScreen::drawArcadePanel() {
+    drawPanel(arcadeBtns_);
+    arcadeBtns_.drawValue(window_.canvas(), layout::levelBox, app_.game.stats.level, false);
+}
+
+void GameScreen::drawPanel(const ButtonPanel& panel) {
+    panel.draw(window_.canvas());
+    panel.drawValue(window_.canvas(), layout::bestScoreBox, app_.game.stats.bestScore, false);
+    panel.drawValue(window_.canvas(), layout::scoreBox, app_.game.stats.score, false);
+}
+
+void GameScreen::drawPlayPanel() {
+    quabble::drawPlayPanel(window_.canvas(), playPanelBox_, spriteSheet());
+}
+
+void GameScreen::drawBoard() {
+    quabble::drawBoard(window_.canvas(), boardBox_, spriteSheet(), app_.game.grid);
+}
+
+void GameScreen::drawCell(CellPosition place, std::int16_t tile) {
+    quabble::drawCell(window_.canvas(), boardBox_, spriteSheet(), static_cast<std::int16_t>(place.column - 1),
+                      static_cast<std::int16_t>(place.row - 1), tile);
+}
+
+void GameScreen::drawPoints(CellPosition place, std::int32_t points) {
+    const Rect cell = boardBox_.cell(place.column - 1, place.row - 1);
+    const ScreenButton label{.left = cell.left,
+                             .top = cell.top,
+                             .width = cell.width(),
+                             .height = cell.height(),
+                             .textColour = palette::panelTextColour,
+                             .font = pointsFont};
+    drawLabelledBox(window_.canvas(), label, BoxStyle::Plain, false, 2, std::to_string(points));
+}
+
+void GameScreen::updateScore() {
+    if (app_.game.isGameActive())
+        panel().drawValue(window_.canvas(), layout::scoreBox, app_.game.stats.score, false);
+}
+
+void GameScreen::displayLevel() {
+    arcadeBtns_.drawValue(window_.canvas(), layout::levelBox, app_.game.stats.level, true);
+}
+
+void GameScreen::drawPreviewRow(std::int16_t revealed) {
+    quabble::drawPreviewRow(window_.canvas(), previewBox_, spriteSheet(), app_.game.nextRow, revealed);
+}
+
+void GameScreen::drawGauge(double percentage) {
+    quabble::drawGauge(window_.canvas(), gaugeBox_, spriteSheet(), percentage);
+}
+
+void GameScreen::present() {
+    window_.refresh();
+}
+
+Task<> GameScreen::pause(std::chrono::milliseconds duration) {
+    co_await loop_.pause(duration);
+}
+
+Task<> GameScreen::runPendingMessages() {
+    return loop_.runPendingMessages();
+}
+
+void GameScreen::switchBlockTimer(bool on) {
+    timerBlocks_.setEnabled(on && !gamePaused_);
+}
+
+void GameScreen::setBlockTimerInterval(std::chrono::milliseconds interval) {
+    timerBlocks_.setInterval(interval);
+}
+
+Task<> GameScreen::showResult(bool goNextLevel) {
+    diagWow_.goNextLevel = goNextLevel;
+    co_await loop_.showModal(diagWow_);
+    diagWow_.goNextLevel = false;
+}
+
+Task<std::string> GameScreen::enterName() {
+    co_await loop_.showModal(diagUN_);
+    co_return diagUN_.nameEntered();
+}
+
+Task<> GameScreen::showHighScores(std::int16_t tableIndex) {
+    frmStats_.modeNum = tableIndex;
+    co_await loop_.showModal(frmStats_);
+}
+
+}  // namespace quabble
