@@ -1,6 +1,8 @@
 # Installs the system packages that are missing; to be sourced. Say which group is needed:
 #   need_packages play     to build and start the game
-#   need_packages check    to run every check as well
+#   need_packages desktop  to run every check of the desktop game as well
+#   need_packages web      to check what goes into a browser
+#   need_packages windows  to check what goes to Windows
 #   need_packages package  to build the Debian package
 #   need_packages root     to make a fresh system to try things in
 
@@ -11,18 +13,24 @@ fail() {
 }
 
 packages_of() {
-    [ "$2" != root ] || { printf 'debootstrap'; return; }
-    local list="cmake ninja-build g++ pkg-config libsdl2-dev libx11-dev libxext-dev libsqlite3-dev libstb-dev fonts-liberation librsvg2-bin xdg-utils"
+    local shared="cmake ninja-build g++ libstb-dev fonts-liberation"
     # From Debian 13 and Ubuntu 24.04 on, Sans Narrow is a package of its own.
     case "$1" in
         debian-12) ;;
-        debian-13 | ubuntu-24.04) list+=" fonts-liberation-sans-narrow" ;;
+        debian-13 | ubuntu-24.04) shared+=" fonts-liberation-sans-narrow" ;;
         *) return 1 ;;
     esac
-    [ "$2" != package ] || list+=" dpkg-dev lintian desktop-file-utils appstream man-db groff"
-    [ "$2" != check ] ||
-        list+=" libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 cppcheck valgrind apngasm xvfb openbox icewm xdotool x11-xserver-utils libxtst-dev"
-    printf '%s' "$list"
+    local play="$shared pkg-config libsdl2-dev libx11-dev libxext-dev libsqlite3-dev librsvg2-bin xdg-utils"
+    case "$2" in
+        play) printf '%s' "$play" ;;
+        desktop) printf '%s' "$play libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 cppcheck valgrind" \
+            " apngasm xvfb openbox icewm xdotool x11-xserver-utils libxtst-dev" ;;
+        web) printf '%s' "$shared libgtest-dev clang-19 lld-19 wasi-libc libc++-19-dev-wasm32 libc++abi-19-dev-wasm32" \
+            " libclang-rt-19-dev-wasm32 nodejs" ;;
+        windows) printf '%s' "$shared libgtest-dev g++-mingw-w64-x86-64-posix wine wine64" ;;
+        package) printf '%s' "$play dpkg-dev lintian desktop-file-utils appstream man-db groff" ;;
+        root) printf 'debootstrap' ;;
+    esac
 }
 
 need_packages() {

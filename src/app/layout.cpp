@@ -26,6 +26,7 @@ ScreenButton button(std::int32_t left, std::int32_t top, std::int32_t width) {
 // A panel of `size` entries: a title, `values` pairs of a label and a value box, and buttons.
 std::vector<ScreenButton> panel(std::int32_t size, std::size_t values) {
     std::vector<ScreenButton> entries;
+    entries.reserve(static_cast<std::size_t>(size));
     for (std::int32_t i = 0; i < size; ++i)
         entries.push_back(button(25, 90 + 40 * i, 140));
     entries[0].top = 50;
@@ -53,6 +54,7 @@ Size clientSize() {
 std::vector<ScreenButton> initMMBtns() {
     const std::int32_t left = roundHalfEven(clientSize().width / 2.0 - layoutUnit * 2.5);
     std::vector<ScreenButton> buttons;
+    buttons.reserve(mainMenuButtons);
     for (std::int32_t i = 1; i <= mainMenuButtons; ++i)
         buttons.push_back(button(left, roundHalfEven(30.0 * i * 1.75), layoutUnit * 5));
     return buttons;

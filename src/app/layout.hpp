@@ -5,10 +5,8 @@
 #include "draw/geometry.hpp"
 #include "gfx/screen_button.hpp"
 
-namespace quabble {
-
 // Where everything lies in the main window.
-namespace layout {
+namespace quabble::layout {
 
 constexpr Font captionFont{Typeface::SansBold, 14};  // of buttons, labels and values
 
@@ -37,6 +35,4 @@ CellBox board(const Rect& playPanel);
 CellBox preview(const CellBox& board);
 Rect gauge(const Rect& playPanel, const CellBox& board);
 
-}  // namespace layout
-
-}  // namespace quabble
+}  // namespace quabble::layout

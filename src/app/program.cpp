@@ -21,7 +21,8 @@ Task<> Program::Main() {
     co_await loop_.showModal(diagSWS);
     state_.pictures.backdrop = {};  // only the splash shows it
     state_.settings.solvingData.setSplashSeen();
-    frmQuabble_.emplace(loop_, state_).show();
+    frmQuabble_ = std::make_unique<MainWindow>(loop_, state_);
+    frmQuabble_->show();
     frmQuabble_->showMainMenu();
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstdint>
+#include <memory>
 #include <optional>
 
 #include "app/app_state.hpp"
@@ -59,7 +60,7 @@ class Program {
 
     MessageLoop loop_;
     AppState state_;
-    std::optional<MainWindow> frmQuabble_;
+    std::unique_ptr<MainWindow> frmQuabble_;
     Task<> task_;
 };
 

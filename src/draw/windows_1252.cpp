@@ -58,7 +58,7 @@ void appendUtf8(std::string& text, char32_t codePoint) {
 char characterOf(char32_t codePoint) {
     if (codePoint < 0x80 || (codePoint >= 0xA0 && codePoint <= 0xFF))
         return static_cast<char>(codePoint);
-    const auto* found = std::ranges::find(upperControls, codePoint);
+    const auto found = std::ranges::find(upperControls, codePoint);
     if (codePoint == 0xFFFD || found == upperControls.end())
         return '?';
     return static_cast<char>(0x80 + (found - upperControls.begin()));

@@ -19,7 +19,7 @@ constexpr Entry table[] = {
 }  // namespace
 
 std::string_view loadString(std::uint16_t id) {
-    const auto* entry =
+    const auto entry =
         std::ranges::find_if(table, [&](const Entry& candidate) { return candidate.id == id; });
     assert(entry != std::end(table));
     return entry->text;

@@ -43,7 +43,7 @@ void ScoreView::layOut() {
     buttons_ = {layOutButton(2), layOutButton(6)};
 }
 
-ScreenButton ScoreView::layOutButton(std::int32_t leftUnits) {
+ScreenButton ScoreView::layOutButton(std::int32_t leftUnits) const {
     return {.left = leftUnits * unit_,
             .top = 9 * unit_,
             .width = 3 * unit_,

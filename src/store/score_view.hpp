@@ -29,7 +29,7 @@ class ScoreView final : public Window {
     void clearScores();
 
     void layOut();
-    ScreenButton layOutButton(std::int32_t leftUnits);
+    ScreenButton layOutButton(std::int32_t leftUnits) const;
     void drawTitle();
     void drawRow(std::size_t place);
     void drawButton(std::size_t i, bool highlighted);

@@ -5,7 +5,7 @@
 #include <memory>
 
 #include "../end_to_end/player.hpp"
-#include "monkey.hpp"
+#include "machine.hpp"
 
 namespace quabble {
 namespace {
@@ -126,19 +126,6 @@ TEST(LongDay, EveryScoreIsKeptAndNothingIsLeftBehind) {
     EXPECT_LE(heapInUse(), memory + 64 * 1024) << "after " << day.games() << " games";
     EXPECT_EQ(openFiles(), filesBefore);
     RecordProperty("games", day.games());
-}
-
-TEST(Monkey, FindsNothingWrong) {
-    const char* wished = std::getenv("QUABBLE_MONKEY_EVENTS");
-    const long eventsPerSeed = (wished == nullptr ? 20'000 : std::atol(wished)) / 4;
-    for (std::uint64_t seed = 1; seed <= 4; ++seed) {
-        std::mt19937_64 random(seed);
-        Monkey monkey([&](int limit) { return static_cast<int>(random() % static_cast<unsigned>(limit)); });
-        for (long event = 1; event <= eventsPerSeed; ++event) {
-            monkey.actAndCheck();
-            ASSERT_FALSE(HasFailure()) << "seed " << seed << ", event " << event;
-        }
-    }
 }
 
 }  // namespace
