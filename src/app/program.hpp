@@ -8,7 +8,7 @@
 #include "app/main_window.hpp"
 #include "base/task.hpp"
 #include "platform/message_loop.hpp"
-#include "platform/registry_store.hpp"
+#include "registry/registry_store.hpp"
 
 namespace quabble {
 

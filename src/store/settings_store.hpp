@@ -6,7 +6,7 @@
 #include <memory>
 
 #include "engine/high_scores.hpp"
-#include "platform/registry_store.hpp"
+#include "registry/registry_store.hpp"
 
 namespace quabble {
 

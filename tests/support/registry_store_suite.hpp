@@ -8,7 +8,7 @@
 #include <string>
 #include <vector>
 
-#include "platform/registry_store.hpp"
+#include "registry/registry_store.hpp"
 
 namespace quabble {
 

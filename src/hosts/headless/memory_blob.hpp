@@ -2,7 +2,7 @@
 
 #include <utility>
 
-#include "platform/blob_registry.hpp"
+#include "registry/blob_registry.hpp"
 
 namespace quabble {
 

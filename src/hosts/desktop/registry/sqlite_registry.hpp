@@ -2,7 +2,7 @@
 
 #include <string>
 
-#include "platform/registry_store.hpp"
+#include "registry/registry_store.hpp"
 
 namespace quabble {
 

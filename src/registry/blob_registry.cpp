@@ -1,4 +1,4 @@
-#include "platform/blob_registry.hpp"
+#include "registry/blob_registry.hpp"
 
 #include <algorithm>
 #include <map>

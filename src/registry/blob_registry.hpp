@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/registry_store.hpp"
+#include "registry/registry_store.hpp"
 
 namespace quabble {
 
