@@ -72,7 +72,7 @@ class Process {
         return files.size();
     }
 
-    // How often the process went to sleep of its own accord, and its processor time in milliseconds.
+    // How often the process went to sleep by itself, and its processor time in milliseconds.
     struct Activity {
         double sleeps = 0;
         double processorTime = 0;
@@ -166,7 +166,7 @@ class Screen {
 // Looks ten times a millisecond.
 double millisecondsUntil(const std::function<bool()>& isSo, Clock::time_point since) {
     while (!isSo()) {
-        require(Clock::now() - since < 10s, "waited in vain for a picture");
+        require(Clock::now() - since < 10s, "no picture came");
         std::this_thread::sleep_for(100us);
     }
     return Milliseconds(Clock::now() - since).count();

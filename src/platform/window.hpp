@@ -31,7 +31,7 @@ class Window {
     Window(const Window&) = delete;
     Window& operator=(const Window&) = delete;
 
-    // A new one at every showing: what was meant for an earlier one reaches nobody.
+    // A new one each time it is shown: events for an earlier one are ignored.
     WindowId id() const { return id_; }
     bool isDialog() const { return owner_ != nullptr; }
     bool isShown() const { return shown_; }

@@ -19,7 +19,7 @@ struct RegistryValue {
 };
 
 // What a transaction is for. One that reads sees the registry as it is when it begins, whatever others write
-// meanwhile, and keeps nobody from writing.
+// meanwhile, and does not stop them from writing.
 enum class Access { Read, Write };
 
 // One look at a registry or one change of it, all or nothing. A registry is a tree of keys, whose paths are

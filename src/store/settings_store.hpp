@@ -36,7 +36,7 @@ constexpr const char* unknownName = "Anononymous";
 enum class StoreResult { Done, NotOpened, NotWritten };
 
 // The settings and the tables as they are kept between runs. Once the registry could not be opened it is left
-// alone: nobody is to overwrite what he has never read.
+// alone, so that values that were never read are not overwritten.
 class SettingsStore {
  public:
     // The registry must outlive the store.

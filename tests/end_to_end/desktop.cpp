@@ -28,7 +28,7 @@ void require(bool condition, const std::string& what) {
 void waitUntil(const std::string& what, const std::function<bool()>& isSo) {
     const auto end = std::chrono::steady_clock::now() + patience;
     while (!isSo()) {
-        require(std::chrono::steady_clock::now() < end, "waited in vain: " + what);
+        require(std::chrono::steady_clock::now() < end, "it did not come: " + what);
         std::this_thread::sleep_for(1ms);
     }
 }

@@ -22,8 +22,9 @@ using Tests = std::vector<std::pair<std::string, std::string>>;
 const std::map<std::string, Tests> testsOf{
     {"engine", {{"engine_tests", "-Rules*"}, {"engine_tests", "*"}, {"app_tests", "*"}}},
     {"app", {{"app_tests", "*"}}},
-    {"store", {{"store_tests", "-Crash*"}, {"app_tests", "*"}, {"store_tests", "Crash*"}}},
-    {"platform", {{"store_tests", "-Crash*"}, {"store_tests", "Crash*"}, {"app_tests", "*"}}},
+    {"registry", {{"registry_tests", "*"}, {"store_tests", "*"}}},
+    {"store", {{"store_tests", "*"}, {"app_tests", "*"}, {"hosts_desktop_tests", "*"}}},
+    {"hosts", {{"hosts_desktop_tests", "-Crash*"}, {"hosts_desktop_tests", "Crash*"}}},
 };
 
 struct Mutation {

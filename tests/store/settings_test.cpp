@@ -135,7 +135,7 @@ TEST_F(SettingsTest, AMissingNameCostsItsScore) {
     EXPECT_EQ(kept.table(1).scores[1], 0);
 }
 
-// Nobody is to overwrite what he has never read.
+// Values that were never read are not overwritten.
 TEST_F(SettingsTest, ARegistryThatCouldNotBeOpenedIsLeftAlone) {
     Kept first;
     first.table(1).names[0] = "first";

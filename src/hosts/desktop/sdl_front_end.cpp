@@ -21,7 +21,7 @@ extern "C" void passOnHangUp(int) {
     std::raise(SIGTERM);
 }
 
-// SDL also has displays that nobody sees, and takes what the environment names. Of the pixels it can write
+// SDL also has displays that show nothing, and takes what the environment names. Of the pixels it can write
 // on, those with a palette or ten bits a colour stay blank.
 std::string whyUnusable() {
     const std::string driver = SDL_GetCurrentVideoDriver();

@@ -143,7 +143,7 @@ bool SqliteTransaction::beginReading() {
     return execute("BEGIN") && content() != Content::SomethingElse;
 }
 
-// With a write-ahead log those who read keep nobody from writing. A file that others are reading cannot be
+// With a write-ahead log readers do not block a writer. A file that others are reading cannot be
 // switched over to it; then the lock that it needs without the log is not to be had either. The file is
 // looked at again, for it may have become another meanwhile.
 bool SqliteTransaction::beginWriting() {

@@ -6,7 +6,7 @@ namespace quabble {
 
 // Tells a key press that is meant for a window from the repetition of one that was meant for another: a key
 // that is still down when a dialog opens or closes goes on repeating in the window that has the keyboard
-// then. Keys have the desktop's numbers. Where nobody tells what is held, every press is meant.
+// then. Keys have the desktop's numbers. Where it is not known which keys are held, every press is meant.
 class HeldKeys {
  public:
     using Keys = std::bitset<256>;
