@@ -21,7 +21,7 @@
 
 #include "../tests/support/files.hpp"
 #include "desktop.hpp"
-#include "gfx/sprite_sheet.hpp"
+#include "gfx/sprites.hpp"
 #include "report.hpp"
 
 namespace quabble::bench {
@@ -293,12 +293,12 @@ class DesktopBench {
     // The window's pixel at which a block begins that has one of its kind to its right.
     Point cellOfCluster(const Surface& sheet) {
         const Surface seen = desktop_.look(main_);
-        const int size = sprites::tileSize;
+        const int size = sheet_map::tileSize;
         for (int row = 15; row >= 0; --row) {
             for (int column = 0; column < 11; ++column) {
                 const Point cell{boardAt.x + column * size, boardAt.y + row * size};
                 for (std::int16_t tile = 1; tile <= 3; ++tile) {
-                    const Point from = sprites::tileAt(tile, size);
+                    const Point from{tile * size, 0};
                     if (isSame(seen, cell, sheet, from) && isSame(seen, {cell.x + size, cell.y}, sheet, from))
                         return cell;
                 }
@@ -308,8 +308,8 @@ class DesktopBench {
         return {};
     }
     static bool isSame(const Surface& seen, Point at, const Surface& sheet, Point from) {
-        for (int y = 0; y < sprites::tileSize; ++y) {
-            for (int x = 0; x < sprites::tileSize; ++x) {
+        for (int y = 0; y < sheet_map::tileSize; ++y) {
+            for (int x = 0; x < sheet_map::tileSize; ++x) {
                 if (seen.at(at.x + x, at.y + y) != sheet.at(from.x + x, from.y + y))
                     return false;
             }

@@ -19,7 +19,6 @@
 #include "../tests/support/files.hpp"
 #include "engine/game.hpp"
 #include "gfx/painters.hpp"
-#include "gfx/sprite_sheet.hpp"
 #include "hosts/desktop/sdl_front_end.hpp"
 #include "platform/timer.hpp"
 #include "platform/window.hpp"
@@ -56,8 +55,9 @@ void compare(const char* what, const std::function<void()>& act, const std::func
 }
 
 void measurePainters(const Surface& sheet) {
-    Canvas canvas(windowSize);
-    const CellBox board{232, 37, sprites::tileSize};
+    Canvas canvas(windowSize, Scale());
+    const Sprites sprites = spritesOf(sheet, Scale());
+    const CellBox board{232, 37, sheet_map::tileSize};
     PlayGrid grid;
     grid.recreate(maxGridCols, maxGridRows);
     SeededRandom random(1);
@@ -66,7 +66,7 @@ void measurePainters(const Surface& sheet) {
     const std::vector<char> from(bytes, 'a');
     std::vector<char> to(bytes);
     compare(
-        "drawBoard of 192 cells | memcpy of its bytes", [&] { drawBoard(canvas, board, sheet, grid); },
+        "drawBoard of 192 cells | memcpy of its bytes", [&] { drawBoard(canvas, board, sprites, grid); },
         [&] {
             std::memcpy(to.data(), from.data(), bytes);
             asm volatile("" : : "r"(to.data()) : "memory");  // somebody may read it

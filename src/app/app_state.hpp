@@ -6,7 +6,7 @@
 #include "engine/high_scores.hpp"
 #include "engine/level_table.hpp"
 #include "engine/random_source.hpp"
-#include "gfx/sprite_sheet.hpp"
+#include "gfx/pictures.hpp"
 #include "store/settings_store.hpp"
 
 namespace quabble {
@@ -16,8 +16,9 @@ constexpr std::int16_t layoutUnit = 45;  // pixels; the windows' layouts are mul
 // What lives as long as the program and is no window: the game, the tables, the settings, the pictures.
 class AppState {
  public:
-    // The registry must outlive the state.
-    AppState(RegistryStore& registry, std::uint64_t seed) : random(seed), settingsStore_(registry) {}
+    // The front end and the registry must outlive the state.
+    AppState(FrontEnd& frontEnd, RegistryStore& registry, std::uint64_t seed)
+        : random(seed), pictures(frontEnd), settingsStore_(registry) {}
 
     SeededRandom random;
     LevelTable levelTable;

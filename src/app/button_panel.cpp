@@ -15,17 +15,25 @@ constexpr std::int32_t leftShadow = 3;  // of a button that the pointer has left
 
 }  // namespace
 
-std::string_view ButtonPanel::captionOf(std::size_t box) const {
-    return loadString(static_cast<std::uint16_t>(captionBase_ + box + 1));
+void ButtonPanel::draw(Canvas& canvas) {
+    looks_.assign(boxes_.size(), Look::Resting);
+    drawAgain(canvas);
 }
 
-void ButtonPanel::draw(Canvas& canvas) const {
-    for (std::size_t i = 0; i < boxes_.size(); ++i) {
-        const bool isButton = boxes_[i].active == BoxKind::Button;
+void ButtonPanel::drawAgain(Canvas& canvas) const {
+    for (std::size_t i = 0; i < looks_.size(); ++i) {
         if (boxes_[i].active != BoxKind::ValueBox)
-            drawLabelledBox(canvas, boxes_[i], BoxStyle::Plain, false,
-                            isButton ? restingShadow_ : labelShadow, captionOf(i));
+            drawBox(canvas, i);
     }
+}
+
+void ButtonPanel::drawBox(Canvas& canvas, std::size_t box) const {
+    const bool isHovered = looks_[box] == Look::Hovered;
+    std::int32_t shadow = boxes_[box].active == BoxKind::Button ? restingShadow_ : labelShadow;
+    if (looks_[box] != Look::Resting)
+        shadow = isHovered ? hoveredShadow : leftShadow;
+    drawLabelledBox(canvas, boxes_[box], isHovered ? BoxStyle::Framed : BoxStyle::Plain, isHovered, shadow,
+                    loadString(static_cast<std::uint16_t>(captionBase_ + box + 1)));
 }
 
 void ButtonPanel::drawValue(Canvas& canvas, std::size_t box, std::int32_t value, bool highlighted) const {
@@ -52,9 +60,9 @@ bool ButtonPanel::highlightNext(Canvas& canvas, float x, float y) {
     if (button == boxes_.end())
         return false;
     button->hovered = !button->hovered;
-    drawLabelledBox(canvas, *button, button->hovered ? BoxStyle::Framed : BoxStyle::Plain, button->hovered,
-                    button->hovered ? hoveredShadow : leftShadow,
-                    captionOf(static_cast<std::size_t>(button - boxes_.begin())));
+    const auto box = static_cast<std::size_t>(button - boxes_.begin());
+    looks_[box] = button->hovered ? Look::Hovered : Look::Left;
+    drawBox(canvas, box);
     return true;
 }
 

@@ -19,8 +19,9 @@ class ButtonPanel {
     ButtonPanel(std::vector<ScreenButton> boxes, std::uint16_t captionBase, std::int32_t restingShadow)
         : boxes_(std::move(boxes)), captionBase_(captionBase), restingShadow_(restingShadow) {}
 
-    // Draws the buttons, at rest, and the labels.
-    void draw(Canvas& canvas) const;
+    // Draws the buttons, at rest, and the labels; or once more as they were drawn last.
+    void draw(Canvas& canvas);
+    void drawAgain(Canvas& canvas) const;
     void drawValue(Canvas& canvas, std::size_t box, std::int32_t value, bool highlighted) const;
 
     // Which button, of the buttons alone, counted from 0, is at that place.
@@ -30,9 +31,11 @@ class ButtonPanel {
     bool highlightNext(Canvas& canvas, float x, float y);
 
  private:
-    std::string_view captionOf(std::size_t box) const;
+    enum class Look { Resting, Hovered, Left };
+    void drawBox(Canvas& canvas, std::size_t box) const;
 
     std::vector<ScreenButton> boxes_;
+    std::vector<Look> looks_;  // of each box as it is drawn; none before that
     std::uint16_t captionBase_ = 0;
     std::int32_t restingShadow_ = 0;
 };

@@ -31,8 +31,13 @@ void GameScreen::setPaused(bool paused) {
     switchBlockTimer(app_.game.arcadeActive && app_.game.gameMode == GameMode::Timed);
 }
 
+ButtonPanel& GameScreen::panel() {
+    return shown_ == Shown::ClassicGame ? standardBtns_ : arcadeBtns_;
+}
+
 std::optional<PanelButton> GameScreen::buttonAt(float x, float y) const {
-    const auto button = panel().buttonAt(x, y);
+    const ButtonPanel& panel = shown_ == Shown::ClassicGame ? standardBtns_ : arcadeBtns_;
+    const auto button = panel.buttonAt(x, y);
     return button ? std::optional(static_cast<PanelButton>(*button)) : std::nullopt;
 }
 
@@ -43,9 +48,20 @@ bool GameScreen::isOnPreview(float x, float y) const {
 }
 
 void GameScreen::highlightUnderPointer(float x, float y) {
-    ButtonPanel& panel = app_.game.classicActive ? standardBtns_ : arcadeBtns_;
-    while (panel.highlightNext(window_.canvas(), x, y))
+    while (panel().highlightNext(window_.canvas(), x, y))
         window_.refresh();
+}
+
+void GameScreen::paint() {
+    clear();
+    panel().drawAgain(window_.canvas());
+    drawValues();
+    drawPlayPanel();
+    drawBoard();
+    if (shown_ == Shown::ArcadeGame) {
+        drawPreviewRow(revealed_);
+        drawGauge(percentage_);
+    }
 }
 
 BoardArea GameScreen::layOutClassic() {
@@ -66,34 +82,48 @@ BoardArea GameScreen::layOutOn(const Rect& playPanel) {
 }
 
 void GameScreen::clearWindow() {
+    shown_ = Shown::Nothing;
+    clear();
+}
+
+void GameScreen::clear() {
     window_.canvas().fill(window_.canvas().bounds(), palette::backgroundColour);
 }
 
 void GameScreen::drawClassicPanel() {
-    drawPanel(standardBtns_);
+    shown_ = Shown::ClassicGame;
+    drawPanel();
 }
 
 void GameScreen::drawArcadePanel() {
-    drawPanel(arcadeBtns_);
-    arcadeBtns_.drawValue(window_.canvas(), layout::levelBox, app_.game.stats.level, false);
+    shown_ = Shown::ArcadeGame;
+    drawPanel();
 }
 
-void GameScreen::drawPanel(const ButtonPanel& panel) {
-    panel.draw(window_.canvas());
-    panel.drawValue(window_.canvas(), layout::bestScoreBox, app_.game.stats.bestScore, false);
-    panel.drawValue(window_.canvas(), layout::scoreBox, app_.game.stats.score, false);
+void GameScreen::drawPanel() {
+    const GameStats& stats = app_.game.stats;
+    figures_ = {stats.bestScore, stats.score, stats.level, false};
+    panel().draw(window_.canvas());
+    drawValues();
+}
+
+void GameScreen::drawValues() {
+    panel().drawValue(window_.canvas(), layout::bestScoreBox, figures_.bestScore, false);
+    panel().drawValue(window_.canvas(), layout::scoreBox, figures_.score, false);
+    if (shown_ == Shown::ArcadeGame)
+        panel().drawValue(window_.canvas(), layout::levelBox, figures_.level, figures_.isLevelHighlighted);
 }
 
 void GameScreen::drawPlayPanel() {
-    quabble::drawPlayPanel(window_.canvas(), playPanelBox_, spriteSheet());
+    quabble::drawPlayPanel(window_.canvas(), playPanelBox_, sprites());
 }
 
 void GameScreen::drawBoard() {
-    quabble::drawBoard(window_.canvas(), boardBox_, spriteSheet(), app_.game.grid);
+    quabble::drawBoard(window_.canvas(), boardBox_, sprites(), app_.game.grid);
 }
 
 void GameScreen::drawCell(CellPosition place, std::int16_t tile) {
-    quabble::drawCell(window_.canvas(), boardBox_, spriteSheet(), static_cast<std::int16_t>(place.column - 1),
+    quabble::drawCell(window_.canvas(), boardBox_, sprites(), static_cast<std::int16_t>(place.column - 1),
                       static_cast<std::int16_t>(place.row - 1), tile);
 }
 
@@ -109,20 +139,26 @@ void GameScreen::drawPoints(CellPosition place, std::int32_t points) {
 }
 
 void GameScreen::updateScore() {
-    if (app_.game.isGameActive())
-        panel().drawValue(window_.canvas(), layout::scoreBox, app_.game.stats.score, false);
+    if (!app_.game.isGameActive())
+        return;
+    figures_.score = app_.game.stats.score;
+    panel().drawValue(window_.canvas(), layout::scoreBox, figures_.score, false);
 }
 
 void GameScreen::displayLevel() {
-    arcadeBtns_.drawValue(window_.canvas(), layout::levelBox, app_.game.stats.level, true);
+    figures_.level = app_.game.stats.level;
+    figures_.isLevelHighlighted = true;
+    panel().drawValue(window_.canvas(), layout::levelBox, figures_.level, true);
 }
 
 void GameScreen::drawPreviewRow(std::int16_t revealed) {
-    quabble::drawPreviewRow(window_.canvas(), previewBox_, spriteSheet(), app_.game.nextRow, revealed);
+    revealed_ = revealed;
+    quabble::drawPreviewRow(window_.canvas(), previewBox_, sprites(), app_.game.nextRow, revealed);
 }
 
 void GameScreen::drawGauge(double percentage) {
-    quabble::drawGauge(window_.canvas(), gaugeBox_, spriteSheet(), percentage);
+    percentage_ = percentage;
+    quabble::drawGauge(window_.canvas(), gaugeBox_, sprites(), percentage);
 }
 
 void GameScreen::present() {

@@ -42,6 +42,9 @@ class GameScreen final : public Stage {
     bool isOnPreview(float x, float y) const;
     void highlightUnderPointer(float x, float y);
 
+    // Paints all that was drawn for the game that is on the screen once more, as it is outside a move.
+    void paint();
+
     BoardArea layOutClassic() override;
     BoardArea layOutArcade() override;
     void clearWindow() override;
@@ -66,10 +69,12 @@ class GameScreen final : public Stage {
     void showMainMenu() override { handlers_.showMainMenu(); }
 
  private:
-    const ButtonPanel& panel() const { return app_.game.classicActive ? standardBtns_ : arcadeBtns_; }
-    const Surface& spriteSheet() const { return app_.pictures.spriteSheet; }
+    const Sprites& sprites() { return app_.pictures.sprites(window_.canvas().scale()); }
+    ButtonPanel& panel();
     BoardArea layOutOn(const Rect& playPanel);
-    void drawPanel(const ButtonPanel& panel);
+    void clear();
+    void drawPanel();
+    void drawValues();
 
     MessageLoop& loop_;
     Window& window_;
@@ -81,6 +86,19 @@ class GameScreen final : public Stage {
     ResultDialog diagWow_;
     NameEntry diagUN_;
     ScoreView frmStats_;
+
+    // What is drawn beside the board.
+    enum class Shown { Nothing, ClassicGame, ArcadeGame };
+    struct Figures {
+        std::int32_t bestScore = 0;
+        std::int32_t score = 0;
+        std::int32_t level = 0;
+        bool isLevelHighlighted = false;
+    };
+    Shown shown_ = Shown::Nothing;
+    Figures figures_;
+    std::int16_t revealed_ = 0;  // of the waiting row
+    double percentage_ = 0;      // of the gauge
 
     ButtonPanel standardBtns_;
     ButtonPanel arcadeBtns_;

@@ -45,10 +45,18 @@ void MainWindow::Form_Load() {
     setClientSize(layout::clientSize());
     setPosition({(loop().frontEnd().screenSize().width - clientSize().width) / 2, 0});
     setCaption(std::string(applicationTitle) + "  Ver " + versionText());
-    lblPause_.area = canvas().bounds();
+    lblPause_.area = Rect::ofSize(0, 0, clientSize().width, clientSize().height);
     app_.game.mainMenuActive = true;
     app_.game.grid.recreate(12, 15);
+}
+
+void MainWindow::Form_Paint() {
+    if (!app_.game.mainMenuActive) {
+        screen_.paint();
+        return;
+    }
     screen_.clearWindow();
+    mmBtns_.drawAgain(canvas());
 }
 
 // The settings are saved while the window is still there for a message to stand in front of.

@@ -26,6 +26,7 @@ class MainWindow final : public Window {
 
  private:
     void Form_Load() override;
+    void Form_Paint() override;
     Task<> Form_QueryUnload() override;
     void Form_Unload() override;
     void Form_Resize() override;

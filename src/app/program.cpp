@@ -6,7 +6,7 @@
 namespace quabble {
 
 Program::Program(FrontEnd& frontEnd, RegistryStore& registry, std::uint64_t seed)
-    : loop_(frontEnd), state_(registry, seed), task_(run()) {}
+    : loop_(frontEnd), state_(frontEnd, registry, seed), task_(run()) {}
 
 Task<> Program::run() {
     co_await Main();
@@ -16,10 +16,8 @@ Task<> Program::run() {
 Task<> Program::Main() {
     if (state_.load() == StoreResult::NotOpened)
         co_await showStoreMessage(loop_, nullptr);
-    state_.pictures = loadGraphics(loop_.frontEnd());
-    Splash diagSWS(loop_, state_.pictures.backdrop);
+    Splash diagSWS(loop_, state_.pictures);
     co_await loop_.showModal(diagSWS);
-    state_.pictures.backdrop = {};  // only the splash shows it
     state_.settings.solvingData.setSplashSeen();
     frmQuabble_ = std::make_unique<MainWindow>(loop_, state_);
     frmQuabble_->show();

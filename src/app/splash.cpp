@@ -16,27 +16,32 @@ constexpr Colour taglineColour{200, 200, 250};
 
 }  // namespace
 
-Splash::Splash(MessageLoop& loop, const Surface& backdrop)
-    : Window(loop), backdrop_(backdrop), splashTimer_(loop, [this] { return splashTimer_Timer(); }) {}
+Splash::Splash(MessageLoop& loop, Pictures& pictures)
+    : Window(loop), pictures_(pictures), splashTimer_(loop, [this] { return splashTimer_Timer(); }) {}
 
 void Splash::Form_Load() {
     setCaption(std::string(applicationTitle));
     setBorderless();
     setClientSize(splashSize);
-    copyPicture(canvas(), canvas().bounds(), backdrop_);
     tagline_ = {.left = 350,
                 .top = 400,
                 .width = 200,
                 .height = 40,
                 .textColour = taglineColour,
                 .font = {Typeface::SansBold, 9, true}};
-    drawShadowText(canvas(), tagline_, 2, loadString(string_ids::tagline), defaultTextFormat);
     splashTimer_.setInterval(1000ms);
     splashTimer_.setEnabled(true);
     ticksLeft_ = 2;
 }
 
+void Splash::Form_Paint() {
+    canvas().copy(canvas().bounds(), pictures_.backdrop(canvas().scale()));
+    drawShadowText(canvas(), tagline_, 2, loadString(string_ids::tagline), defaultTextFormat);
+}
+
+// The first tick is a good time to make ready what the games are drawn with.
 Task<> Splash::splashTimer_Timer() {
+    pictures_.sprites(canvas().scale());
     if (--ticksLeft_ < 1) {
         splashTimer_.setEnabled(false);
         unload();

@@ -2,6 +2,7 @@
 
 #include <cstdint>
 
+#include "gfx/pictures.hpp"
 #include "gfx/screen_button.hpp"
 #include "platform/timer.hpp"
 #include "platform/window.hpp"
@@ -12,16 +13,17 @@ namespace quabble {
 // ticks of a second.
 class Splash final : public Window {
  public:
-    // The loop and the backdrop must outlive the splash.
-    Splash(MessageLoop& loop, const Surface& backdrop);
+    // The loop and the pictures must outlive the splash.
+    Splash(MessageLoop& loop, Pictures& pictures);
 
  private:
     void Form_Load() override;
+    void Form_Paint() override;
     bool isClickable(float x, float y) const override { return hitTest(tagline_, x, y); }
     Task<> Form_MouseDown(float x, float y) override;
     Task<> splashTimer_Timer();
 
-    const Surface& backdrop_;
+    Pictures& pictures_;
     Timer splashTimer_;
     ScreenButton tagline_;
     std::int16_t ticksLeft_ = 0;

@@ -36,7 +36,79 @@ std::int32_t pixelSeenAt(std::int32_t at, std::int32_t window, std::int32_t pict
     return static_cast<std::int32_t>(floorDivision(centre, 2 * std::int64_t{window}).quotient);
 }
 
+// How much of each of the large picture's pixels lies under each device pixel, along one axis, in a measure
+// in which both have whole lengths.
+struct Share {
+    std::int32_t pixel = 0;
+    std::uint32_t length = 0;
+};
+
+std::vector<std::vector<Share>> sharesOf(std::int32_t largePixels, std::int32_t factor, Scale scale) {
+    const std::int32_t large = scale.quarters();  // the length of one of the large picture's pixels
+    const std::int32_t device = 4 * factor;
+    const std::int32_t end = largePixels * large;
+    std::vector<std::vector<Share>> shares;
+    for (std::int32_t begin = 0; begin < end; begin += device) {
+        std::vector<Share>& under = shares.emplace_back();
+        const std::int32_t last = std::min(begin + device, end);
+        for (std::int32_t at = begin; at < last;) {
+            const std::int32_t next = std::min((at / large + 1) * large, last);
+            under.push_back({at / large, static_cast<std::uint32_t>(next - at)});
+            at = next;
+        }
+    }
+    return shares;
+}
+
+// A sum of colours, each counted so many times.
+struct Sum {
+    std::uint32_t red = 0, green = 0, blue = 0, count = 0;
+
+    void add(std::uint32_t pixel, std::uint32_t times) {
+        const Colour colour = colourOf(pixel);
+        red += colour.red * times;
+        green += colour.green * times;
+        blue += colour.blue * times;
+        count += times;
+    }
+    std::uint32_t mean() const {
+        const auto part = [this](std::uint32_t sum) {
+            return static_cast<std::uint8_t>((sum + count / 2) / count);
+        };
+        return pixelOf({part(red), part(green), part(blue)});
+    }
+};
+
 }  // namespace
+
+Surface reduced(const Surface& large, std::int32_t factor, Scale scale) {
+    const auto columns = sharesOf(large.width(), factor, scale);
+    const auto rows = sharesOf(large.height(), factor, scale);
+    Surface picture(static_cast<std::int32_t>(columns.size()), static_cast<std::int32_t>(rows.size()));
+    for (std::int32_t y = 0; y < picture.height(); ++y) {
+        const auto line = picture.row(y);
+        for (std::size_t x = 0; x < columns.size(); ++x) {
+            Sum sum;
+            for (const Share& row : rows[static_cast<std::size_t>(y)]) {
+                const auto from = large.row(row.pixel);
+                for (const Share& column : columns[x])
+                    sum.add(from[static_cast<std::size_t>(column.pixel)], row.length * column.length);
+            }
+            line[x] = sum.mean();
+        }
+    }
+    return picture;
+}
+
+Surface magnified(const Surface& picture, Scale scale) {
+    const Size size{picture.width(), picture.height()};
+    const Size shown = scale.deviceAround(size);
+    Surface large(shown.width, shown.height);
+    Magnifier(size, shown)
+        .show(picture, large.row(0).data(),
+              std::ptrdiff_t{shown.width} * static_cast<std::ptrdiff_t>(sizeof(std::uint32_t)));
+    return large;
+}
 
 double scaleFor(double dotsPerInch, Size picture, Size available) {
     const double wanted =

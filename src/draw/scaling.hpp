@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "draw/geometry.hpp"
+#include "draw/scale.hpp"
 #include "draw/surface.hpp"
 
 namespace quabble {
@@ -18,6 +19,14 @@ Size scaled(Size size, double scale);
 
 // The picture's pixel that is seen at a pixel of the window that shows it, also beyond its edges.
 Point pixelSeenAt(Point shown, Size window, Size picture);
+
+// A picture that is drawn `factor` times as large as the program's pixels, at a scale of its own: each pixel
+// is the mean of what it covers. Where its size is no whole number of device pixels it is the next larger
+// one.
+Surface reduced(const Surface& large, std::int32_t factor, Scale scale);
+
+// A picture that is drawn in the program's pixels, as large as the scale asks for.
+Surface magnified(const Surface& picture, Scale scale);
 
 // Shows pictures of one size at another: each pixel is repeated the next whole number of times, and what that
 // is too large is taken off by linear interpolation. So whole scales are exact, and others are as sharp as

@@ -52,15 +52,6 @@ void Surface::fill(const Rect& area, Colour colour) {
     }
 }
 
-void Surface::outline(const Rect& area, Colour colour) {
-    if (area.isEmpty())
-        return;
-    fill({area.left, area.top, area.right, area.top + 1}, colour);
-    fill({area.left, area.bottom - 1, area.right, area.bottom}, colour);
-    fill({area.left, area.top, area.left + 1, area.bottom}, colour);
-    fill({area.right - 1, area.top, area.right, area.bottom}, colour);
-}
-
 void Surface::copy(const Rect& area, const Surface& source, Point from) {
     combine(area, source, from, [](const std::uint32_t* line, std::size_t width, std::uint32_t* to) {
         copyLine(line, width, to);

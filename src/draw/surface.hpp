@@ -33,7 +33,6 @@ class Surface {
     std::span<std::uint32_t> row(std::int32_t y);
 
     void fill(const Rect& area, Colour colour);
-    void outline(const Rect& area, Colour colour);  // 1 pixel wide, within the rectangle
 
     // Copies the source's pixels from `from` on into the area; `andCopy` combines them with what is there by
     // a bitwise AND. A line must not be copied over itself.

@@ -28,23 +28,27 @@ void paintGlyph(Surface& surface, const Rect& clip, const Glyph& glyph, Point or
     }
 }
 
-void paintLine(Surface& surface, const Rect& clip, std::string_view text, double left, std::int32_t top,
-               Colour colour, const Font& font) {
-    ScaledFont& scaled = scaledFont(font.face, font.points);
-    const std::int32_t baseline = top + scaled.ascent();
+// The clip is in device pixels, the place in the program's.
+void paintLine(Surface& surface, Scale scale, const Rect& clip, std::string_view text, double left,
+               std::int32_t top, Colour colour, const Font& font) {
+    const ScaledFont& layout = scaledFont(font.face, font.points);
+    ScaledFont& glyphs = scaledFont(font.face, font.points * scale.factor());
+    const std::int32_t baseline = top + layout.ascent();
     // No glyph reaches further from its pen than this; of a long line most lie far outside.
-    const std::int32_t reach = 2 * scaled.lineHeight();
+    const std::int32_t reach = 2 * glyphs.lineHeight();
     double pen = left;
     for (const char character : text) {
-        if (pen > clip.left - reach && pen < clip.right + reach) {
-            paintGlyph(surface, clip, scaled.glyph(character, pen), {ScaledFont::wholePixel(pen), baseline},
-                       colour);
+        const double place = pen * scale.factor();
+        if (place > clip.left - reach && place < clip.right + reach) {
+            paintGlyph(surface, clip, glyphs.glyph(character, place),
+                       {ScaledFont::wholePixel(place), scale.edge(baseline)}, colour);
         }
-        pen += scaled.advance(character);
+        pen += layout.advance(character);
     }
     if (font.underlined) {
-        const Rect line{ScaledFont::wholePixel(left), baseline + 2, ScaledFont::wholePixel(pen),
-                        baseline + 3};
+        const std::int32_t lineTop = scale.edge(baseline + 2);
+        const Rect line{scale.edge(ScaledFont::wholePixel(left)), lineTop,
+                        scale.edge(ScaledFont::wholePixel(pen)), lineTop + scale.line()};
         surface.fill(line.intersection(clip), colour);
     }
 }
@@ -74,21 +78,21 @@ std::string_view takeLine(std::string_view& text) {
 
 }  // namespace
 
-void drawText(Surface& surface, const Rect& area, std::string_view text, std::int32_t format, Colour colour,
-              const Font& font) {
-    ScaledFont& scaled = scaledFont(font.face, font.points);
-    const Rect clip = area.intersection(surface.bounds());
+void drawText(Surface& surface, Scale scale, const Rect& area, std::string_view text, std::int32_t format,
+              Colour colour, const Font& font) {
+    const ScaledFont& layout = scaledFont(font.face, font.points);
+    const Rect clip = scale.device(area).intersection(surface.bounds());
     const bool single = (format & text_format::singleLine) != 0;
     std::int32_t top = area.top;
     if (single && (format & text_format::verticalCentre) != 0)
-        top += nearestPixel((area.height() - scaled.lineHeight()) / 2.0);
+        top += nearestPixel((area.height() - layout.lineHeight()) / 2.0);
     while (!text.empty()) {
         const std::string_view line = single ? std::exchange(text, {}) : takeLine(text);
         double left = area.left;
         if ((format & text_format::centre) != 0)
-            left += (area.width() - lineWidth(line, scaled)) / 2;
-        paintLine(surface, clip, line, left, top, colour, font);
-        top += scaled.lineHeight();
+            left += (area.width() - lineWidth(line, layout)) / 2;
+        paintLine(surface, scale, clip, line, left, top, colour, font);
+        top += layout.lineHeight();
     }
 }
 

@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <string_view>
 
+#include "draw/scale.hpp"
 #include "draw/surface.hpp"
 
 namespace quabble {
@@ -30,8 +31,11 @@ constexpr std::int32_t singleLine = 32;
 // first one starts at the rectangle's top. A line is centred to a quarter of a pixel, so that the two copies
 // of a text with a shadow lie equally far apart whatever its length; up and down it stays on whole pixels,
 // where it is sharp. The glyphs are smoothed and kept for the next time.
-void drawText(Surface& surface, const Rect& area, std::string_view text, std::int32_t format, Colour colour,
-              const Font& font);
+//
+// The area is in the program's pixels, and so is the layout: at every scale each line and each letter begins
+// where it does at scale 1, but for less than a device pixel.
+void drawText(Surface& surface, Scale scale, const Rect& area, std::string_view text, std::int32_t format,
+              Colour colour, const Font& font);
 
 // How far a character moves the pen, in pixels.
 double advanceOf(char character, const Font& font);

@@ -24,15 +24,18 @@ void MessageDialog::Form_Load() {
     const std::int32_t buttonTop = 2 * margin + lineHeight;
     setCaption(title_);
     setClientSize({width, buttonTop + okButtonSize.height + margin});
-    canvas().fill(canvas().bounds(), palette::backgroundColour);
-    const ScreenButton label{.left = margin,
-                             .top = margin,
-                             .width = width - 2 * margin,
-                             .height = lineHeight,
-                             .textColour = palette::valueColour,
-                             .font = messageFont};
-    drawShadowText(canvas(), label, 1, text_, text_format::centre);
+    label_ = {.left = margin,
+              .top = margin,
+              .width = width - 2 * margin,
+              .height = lineHeight,
+              .textColour = palette::valueColour,
+              .font = messageFont};
     okBox_ = layOutOkButton((width - okButtonSize.width) / 2, buttonTop);
+}
+
+void MessageDialog::Form_Paint() {
+    canvas().fill(canvas().bounds(), palette::backgroundColour);
+    drawShadowText(canvas(), label_, 1, text_, text_format::centre);
     drawOkButton(canvas(), okBox_);
 }
 

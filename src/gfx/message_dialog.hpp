@@ -15,9 +15,11 @@ class MessageDialog final : public OkDialog {
 
  private:
     void Form_Load() override;
+    void Form_Paint() override;
 
     std::string title_;  // UTF-8
     std::string text_;   // Windows-1252
+    ScreenButton label_;
 };
 
 }  // namespace quabble

@@ -3,16 +3,8 @@
 #include <algorithm>
 
 #include "base/round_half_even.hpp"
-#include "gfx/sprite_sheet.hpp"
 
 namespace quabble {
-namespace {
-
-void copyTile(Canvas& canvas, const Rect& square, const Surface& spriteSheet, std::int16_t tile) {
-    canvas.copy(square, spriteSheet, sprites::tileAt(tile, square.width()));
-}
-
-}  // namespace
 
 bool hitTest(const Rect& area, float x, float y) {
     return static_cast<float>(area.left) < x && x < static_cast<float>(area.right) &&
@@ -30,7 +22,7 @@ void drawLabelledBox(Canvas& canvas, const ScreenButton& box, BoxStyle style, bo
     if (style != BoxStyle::Plain && box.framePen)
         canvas.outline(box.rect(), box.framePen->colour);
     if (style == BoxStyle::DoubleFramed)
-        canvas.outline(box.rect().shrunkBy(1), palette::lightPen.colour);
+        canvas.outline(box.rect(), palette::lightPen.colour, 1);
 
     constexpr std::int32_t format =
         text_format::centre + text_format::verticalCentre + text_format::singleLine;
@@ -51,43 +43,38 @@ void drawShadowText(Canvas& canvas, const ScreenButton& box, std::int32_t offset
     canvas.write(area, text, flags, box.font, box.textColour);
 }
 
-void drawCell(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, std::int16_t column,
+void drawCell(Canvas& canvas, const CellBox& box, const Sprites& sprites, std::int16_t column,
               std::int16_t row, std::int16_t tile) {
-    copyTile(canvas, box.cell(column, row), spriteSheet, tile);
+    canvas.copy(box.cell(column, row), sprites.tiles[static_cast<std::size_t>(tile)]);
 }
 
-void drawBoard(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, const PlayGrid& grid) {
+void drawBoard(Canvas& canvas, const CellBox& box, const Sprites& sprites, const PlayGrid& grid) {
     grid.forEachCell([&](CellPosition place, const GridCell& cell) {
-        copyTile(canvas, box.cell(place.column - 1, place.row - 1), spriteSheet, cell.tile);
+        drawCell(canvas, box, sprites, static_cast<std::int16_t>(place.column - 1),
+                 static_cast<std::int16_t>(place.row - 1), cell.tile);
     });
 }
 
-void drawPreviewRow(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, const GridRow& nextRow,
+void drawPreviewRow(Canvas& canvas, const CellBox& box, const Sprites& sprites, const GridRow& nextRow,
                     std::int16_t revealed) {
     const auto columns = static_cast<std::int32_t>(nextRow.size());
     for (std::int32_t i = 1; i <= columns; ++i) {
-        const Rect square = box.cell(i - 1, 0);
-        copyTile(canvas, square, spriteSheet, nextRow[static_cast<std::size_t>(i - 1)].tile);
-        if (i < columns - revealed)
-            canvas.andCopy(square, spriteSheet, sprites::maskAt(box.cellSize));
+        const auto tile = static_cast<std::size_t>(nextRow[static_cast<std::size_t>(i - 1)].tile);
+        const bool isVeiled = i < columns - revealed;
+        canvas.copy(box.cell(i - 1, 0), (isVeiled ? sprites.veiledTiles : sprites.tiles)[tile]);
     }
 }
 
-void drawGauge(Canvas& canvas, const Rect& area, const Surface& spriteSheet, double percentage) {
-    const std::int32_t filled = roundHalfEven(std::min(percentage, 100.0) * sprites::gaugeRows / 100);
-    const Rect whole = Rect::ofSize(area.left, area.top, area.width(), sprites::gaugeRows);
-    const std::int32_t end = area.top + filled;
-    canvas.copy({whole.left, whole.top, whole.right, end}, spriteSheet, sprites::fullGauge);
-    canvas.copy({whole.left, end, whole.right, whole.bottom}, spriteSheet,
-                {sprites::emptyGauge.x, sprites::emptyGauge.y + filled});
+void drawGauge(Canvas& canvas, const Rect& area, const Sprites& sprites, double percentage) {
+    const Rect whole = Rect::ofSize(area.left, area.top, area.width(), sheet_map::gaugeRows);
+    const std::int32_t rows = canvas.scale().device(whole).height();
+    const std::int32_t filled = roundHalfEven(std::min(percentage, 100.0) * rows / 100);
+    canvas.copyRows(whole, sprites.fullGauge, 0, filled);
+    canvas.copyRows(whole, sprites.emptyGauge, filled, rows);
 }
 
-void drawPlayPanel(Canvas& canvas, const Rect& area, const Surface& spriteSheet) {
-    canvas.copy(area, spriteSheet, sprites::playPanel);
-}
-
-void copyPicture(Canvas& canvas, const Rect& area, const Surface& picture) {
-    canvas.copy(area, picture, {0, 0});
+void drawPlayPanel(Canvas& canvas, const Rect& area, const Sprites& sprites) {
+    canvas.copy(area, sprites.playPanel);
 }
 
 }  // namespace quabble

@@ -7,6 +7,7 @@
 #include "engine/grid_cell.hpp"
 #include "engine/play_grid.hpp"
 #include "gfx/screen_button.hpp"
+#include "gfx/sprites.hpp"
 
 namespace quabble {
 
@@ -31,23 +32,21 @@ constexpr std::int32_t defaultTextFormat = -1;  // at the top left
 void drawShadowText(Canvas& canvas, const ScreenButton& box, std::int32_t offset, std::string_view text,
                     std::int32_t format);
 
-// The painters below copy from a picture.
+// The painters below copy pictures that were made for the canvas's scale.
 
 // Copies a tile to the cell at (column, row), counted from 0.
-void drawCell(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, std::int16_t column,
+void drawCell(Canvas& canvas, const CellBox& box, const Sprites& sprites, std::int16_t column,
               std::int16_t row, std::int16_t tile);
-void drawBoard(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, const PlayGrid& grid);
+void drawBoard(Canvas& canvas, const CellBox& box, const Sprites& sprites, const PlayGrid& grid);
 
 // Draws the waiting row; its last `revealed` + 1 cells show plainly, the others darkened.
-void drawPreviewRow(Canvas& canvas, const CellBox& box, const Surface& spriteSheet, const GridRow& nextRow,
+void drawPreviewRow(Canvas& canvas, const CellBox& box, const Sprites& sprites, const GridRow& nextRow,
                     std::int16_t revealed);
 
-// Draws how far a level has come, 0 to 100 percent, from the top down. It is 241 rows high whatever the area.
-void drawGauge(Canvas& canvas, const Rect& area, const Surface& spriteSheet, double percentage);
+// Draws how far a level has come, 0 to 100 percent, from the top down. It is 241 pixels high whatever the
+// area.
+void drawGauge(Canvas& canvas, const Rect& area, const Sprites& sprites, double percentage);
 
-void drawPlayPanel(Canvas& canvas, const Rect& area, const Surface& spriteSheet);
-
-// Copies a picture's top-left part to the area.
-void copyPicture(Canvas& canvas, const Rect& area, const Surface& picture);
+void drawPlayPanel(Canvas& canvas, const Rect& area, const Sprites& sprites);
 
 }  // namespace quabble

@@ -45,8 +45,12 @@ void ResultDialog::Form_Load() {
     setCaption("Game Statistics");
     setClientSize(designedSize);
     layOut();
+    text_ = resultText(game_, goNextLevel);
+}
+
+void ResultDialog::Form_Paint() {
     canvas().fill(canvas().bounds(), palette::blackBrush.colour);
-    drawShadowText(canvas(), statsBox_, 2, resultText(game_, goNextLevel), text_format::centre);
+    drawShadowText(canvas(), statsBox_, 2, text_, text_format::centre);
     drawOkButton(canvas(), okBox_);
 }
 

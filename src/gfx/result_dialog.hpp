@@ -22,12 +22,14 @@ class ResultDialog final : public OkDialog {
 
  private:
     void Form_Load() override;
+    void Form_Paint() override;
 
     void layOut();
 
     const GameState& game_;
     std::int16_t layoutUnit_;
     ScreenButton statsBox_;
+    std::string text_;
 };
 
 }  // namespace quabble

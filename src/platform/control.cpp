@@ -19,8 +19,8 @@ Task<> Control::keyPress(std::int16_t) {
 }
 
 void paintFocusRing(Canvas& canvas, const Rect& area) {
-    canvas.outline(area.shrunkBy(-1), focusRing);
-    canvas.outline(area.shrunkBy(-2), focusRing);
+    canvas.outline(area, focusRing, -1);
+    canvas.outline(area, focusRing, -2);
 }
 
 void paintControlEdge(Canvas& canvas, const Rect& area, bool hasFocus) {

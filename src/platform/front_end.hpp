@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "draw/geometry.hpp"
+#include "draw/scale.hpp"
 #include "draw/surface.hpp"
 
 namespace quabble {
@@ -33,7 +34,7 @@ struct NativeWindow {
 enum class PointerShape { Arrow, Hand };
 
 // The machine that the program runs on, seen from the program: what a host has to write. Sizes and places are
-// in the program's pixels, however large the host shows them. Texts are UTF-8.
+// in the program's pixels, of which each may be several of the screen's. Texts are UTF-8.
 //
 // The program calls it from inside `start`, `wake` and `requestEnd` of `Program`, and when it is destroyed;
 // all on one thread. An operation may post events, but must not wake the program, and must come back at once:
@@ -45,14 +46,16 @@ class FrontEnd {
     // The time, by a clock that never goes back. It need not go on while the machine sleeps.
     virtual TimePoint now() = 0;
 
-    // Makes a window under an id that was never used before. It comes to be seen with its first picture. If
-    // it cannot be made, an event for the id asks to close it, as if the user had.
-    virtual void createWindow(WindowId window, const NativeWindow& traits) = 0;
+    // Makes a window under an id that was never used before, and says at which scale its pictures are wanted;
+    // a dialog has its owner's. It comes to be seen with its first picture. If it cannot be made, an event
+    // for the id asks to close it, as if the user had. When another scale is wanted later an event says so.
+    virtual Scale createWindow(WindowId window, const NativeWindow& traits) = 0;
 
     // The operations below that name a window are called for those that were created and not closed yet.
 
-    // Shows the picture, of the window's client size. When the window is uncovered or restored the front end
-    // shows it again by itself: it stays where it is until the next one is shown or the window is closed.
+    // Shows the picture, of the window's client size at a scale that was wanted for it, if not always the
+    // latest. When the window is uncovered or restored the front end shows it again by itself: it stays where
+    // it is until the next one is shown or the window is closed.
     virtual void showPixels(WindowId window, const Surface& picture) = 0;
     // The window goes from the screen, its owner is to take input again, and events that are still on their
     // way to it may be posted or not.

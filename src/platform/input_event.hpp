@@ -16,7 +16,8 @@ enum class EventKind {
     Edit,
     CloseButton,
     Minimised,
-    Restored
+    Restored,
+    Rescaled
 };
 
 // Key codes of the characters that mean something here. All other characters mean the same.
@@ -60,6 +61,7 @@ struct InputEvent {
     bool extends = false;                     // of an edit or a mouse press: Shift is held
     std::string text = {};                    // of a text input, UTF-8
     bool continuesClick = false;  // of a mouse press: it follows another quickly, as in a double click
+    Scale scale = {};             // of the pictures that a rescaled window wants from now on
 };
 
 }  // namespace quabble

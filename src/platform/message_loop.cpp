@@ -22,6 +22,7 @@ Task<> MessageLoop::showModal(Window& window) {
         const ModalWindow modal(*this, window);
         tellPointers();
         while (window.isShown()) {
+            repaintRescaled();
             co_await nextMessage();
             co_await deliverOne();
         }
@@ -37,8 +38,17 @@ void MessageLoop::tellPointers() {
     }
 }
 
+// In the midst of a move a window does not know all that is to be seen on it.
+void MessageLoop::repaintRescaled() {
+    for (Window* window : windows_) {
+        if (window->isShown())
+            window->paintAtWantedScale();
+    }
+}
+
 Task<> MessageLoop::run() {
     while (true) {
+        repaintRescaled();
         co_await nextMessage();
         co_await deliverOne();
     }
@@ -111,7 +121,8 @@ Task<> MessageLoop::deliver(InputEvent event) {
         co_return;
     if (event.kind == EventKind::MouseDown && !isMeant(event, *window))
         co_return;
-    const bool isInput = event.kind != EventKind::Minimised && event.kind != EventKind::Restored;
+    const bool isInput = event.kind != EventKind::Minimised && event.kind != EventKind::Restored &&
+                         event.kind != EventKind::Rescaled;
     if (isInput && modalWindow() != nullptr && modalWindow() != window)
         co_return;
     co_await window->handle(event);

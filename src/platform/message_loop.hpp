@@ -105,6 +105,7 @@ class MessageLoop {
     Task<> deliverOne();
     Task<> deliver(InputEvent event);
     void tellPointers();
+    void repaintRescaled();
     bool isMeant(const InputEvent& press, const Window& window);
     Wait nextMessage() { return Wait{*this, std::nullopt}; }
     Window* findWindow(WindowId id) const;

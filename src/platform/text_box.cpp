@@ -24,7 +24,7 @@ void TextBox::paint(Canvas& canvas, bool hasFocus) const {
     paintControlEdge(canvas, area, hasFocus);
     // The line is drawn on a canvas of its own, which cuts off what lies outside the box.
     const Rect window = inner();
-    Canvas line({window.width(), window.height()});
+    Canvas line({window.width(), window.height()}, canvas.scale());
     line.fill(line.bounds(), paper);
     const Rect place{-scroll_, 0, widthUpTo(text_.size()) - scroll_ + 1, window.height()};
     constexpr std::int32_t format = text_format::verticalCentre + text_format::singleLine;
@@ -32,16 +32,16 @@ void TextBox::paint(Canvas& canvas, bool hasFocus) const {
     const auto [first, last] = std::minmax(caret_, anchor_);
     if (first != last) {
         const Rect marked{widthUpTo(first) - scroll_, 0, widthUpTo(last) - scroll_, window.height()};
-        Canvas highlighted({window.width(), window.height()});
+        Canvas highlighted({window.width(), window.height()}, canvas.scale());
         highlighted.fill(highlighted.bounds(), selected);
         highlighted.write(place, text_, format, font, paper);
-        line.copy(marked, highlighted.picture(), {marked.left, 0});
+        line.copyPart(marked, highlighted.picture());
     }
     if (hasFocus) {
         const std::int32_t x = widthUpTo(caret_) - scroll_;
         line.fill({x, 1, x + 1, window.height() - 1}, controlInk);
     }
-    canvas.copy(window, line.picture(), {0, 0});
+    canvas.copy(window, line.picture());
 }
 
 Task<> TextBox::mouseDown(Point at, bool extends) {

@@ -38,11 +38,6 @@ Size Window::outerSize() const {
     return {clientSize().width + nominalFrame.width, clientSize().height + nominalFrame.height};
 }
 
-void Window::setClientSize(Size size) {
-    traits_.clientSize = size;
-    canvas_ = Canvas(size);
-}
-
 void Window::show() {
     assert(!shown_);
     state_ = State::Normal;
@@ -53,8 +48,10 @@ void Window::show() {
     id_ = static_cast<WindowId>(++loop_.lastWindowId_);
     Form_Load();
     traits_.owner = owner_ == nullptr ? WindowId::none : owner_->id_;
-    loop_.frontEnd().createWindow(id_, traits_);
+    wantedScale_ = loop_.frontEnd().createWindow(id_, traits_);
     shown_ = true;
+    canvas_ = Canvas(traits_.clientSize, wantedScale_);
+    Form_Paint();
     tellWhereTextIsTyped();
     refresh();
 }
@@ -171,6 +168,9 @@ Task<> Window::handle(InputEvent event) {
         case EventKind::Restored:
             changeState(State::Normal);
             break;
+        case EventKind::Rescaled:
+            wantedScale_ = event.scale;
+            break;
     }
 }
 
@@ -221,6 +221,14 @@ void Window::focusNext() {
     if (next == controls_.end())
         next = std::ranges::find_if(controls_, takesFocus);
     setFocus(*next);
+}
+
+void Window::paintAtWantedScale() {
+    if (canvas_.scale() == wantedScale_)
+        return;
+    canvas_ = Canvas(traits_.clientSize, wantedScale_);
+    Form_Paint();
+    refresh();
 }
 
 void Window::changeState(State state) {

@@ -41,8 +41,8 @@ class Window {
     Size clientSize() const { return traits_.clientSize; }
     Size outerSize() const;
 
-    // Loads the window (Form_Load), which sets its size, caption and picture, and puts it on the screen. It
-    // must not be there yet.
+    // Loads the window (Form_Load), which sets its size and caption, paints it (Form_Paint) and puts it on
+    // the screen. It must not be there yet.
     void show();
     // Closes the window (Form_Unload). It can be shown again.
     void unload();
@@ -55,7 +55,7 @@ class Window {
  protected:
     MessageLoop& loop() { return loop_; }
     void setCaption(std::string caption) { traits_.caption = std::move(caption); }  // UTF-8
-    void setClientSize(Size size);
+    void setClientSize(Size size) { traits_.clientSize = size; }
     void setPosition(Point position) { traits_.position = position; }
     void setBorderless() { traits_.borderless = true; }
     void addControl(Control& control) { controls_.push_back(&control); }
@@ -67,6 +67,9 @@ class Window {
     // Whether the picture has something there that is to be clicked: the pointer is a hand above it.
     virtual bool isClickable(float /*x*/, float /*y*/) const { return false; }
     virtual void Form_Load() {}
+    // Paints all that is to be seen, as the window's state has it, on a canvas that is new: when it is shown,
+    // and when its scale has changed.
+    virtual void Form_Paint() {}
     // The user wants the window to close; this unloads it.
     virtual Task<> Form_QueryUnload();
     virtual void Form_Unload() {}
@@ -80,6 +83,7 @@ class Window {
     friend class MessageLoop;
     Task<> handle(InputEvent event);
     void changeState(State state);
+    void paintAtWantedScale();
     Control* controlAt(Point at) const;
     Task<> pressControl(Control& control, InputEvent event);
     Task<> pressKey(std::int16_t key);
@@ -94,6 +98,7 @@ class Window {
     WindowId id_ = WindowId::none;
     NativeWindow traits_;
     Canvas canvas_;
+    Scale wantedScale_;
     Canvas composed_;
     std::vector<Control*> controls_;
     Control* focus_ = nullptr;

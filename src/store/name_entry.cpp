@@ -36,7 +36,13 @@ NameEntry::NameEntry(MessageLoop& loop, Window& owner)
 void NameEntry::Form_Load() {
     setCaption("Best Score");
     setClientSize(dialogSize);
-    canvas().fill(canvas().bounds(), palette::backgroundColour);
+    okBox_ = layOutOkButton((dialogSize.width - okButtonSize.width) / 2, 156);
+    OKButton_.area = okBox_.rect();
+    txtName_.clear();
+    setFocus(&txtName_);
+}
+
+void NameEntry::Form_Paint() {
     const auto label = [](std::int32_t top, std::int32_t height, Colour colour, const Font& labelFont) {
         return ScreenButton{.left = margin,
                             .top = top,
@@ -45,15 +51,12 @@ void NameEntry::Form_Load() {
                             .textColour = colour,
                             .font = labelFont};
     };
+    canvas().fill(canvas().bounds(), palette::backgroundColour);
     drawShadowText(canvas(), label(22, 44, palette::valueColour, messageFont), 1, congratulation,
                    text_format::centre);
     drawShadowText(canvas(), label(84, 22, palette::highlightColour, font), 1, "Enter Your Name",
                    defaultTextFormat);
-    const ScreenButton okButton = layOutOkButton((dialogSize.width - okButtonSize.width) / 2, 156);
-    drawOkButton(canvas(), okButton);
-    OKButton_.area = okButton.rect();
-    txtName_.clear();
-    setFocus(&txtName_);
+    drawOkButton(canvas(), okBox_);
 }
 
 void NameEntry::Form_Unload() {

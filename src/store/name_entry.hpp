@@ -21,12 +21,14 @@ class NameEntry final : public Window {
 
  private:
     void Form_Load() override;
+    void Form_Paint() override;
     void Form_Unload() override;
     Task<> Form_KeyPress(std::int16_t key) override;
     Task<> OKButton_Click();
 
     TextBox txtName_;
     PushButton OKButton_;
+    ScreenButton okBox_;
     std::string nameEntered_;
 };
 

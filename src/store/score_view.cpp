@@ -23,12 +23,16 @@ void ScoreView::Form_Load() {
     setCaption("Best Scores - " + std::string(applicationTitle));
     setClientSize(viewSize);
     layOut();
+    isHighlighted_ = {};
+}
+
+void ScoreView::Form_Paint() {
     canvas().fill(canvas().bounds(), palette::viewBrush.colour);
     for (std::size_t place = 0; place < highScorePlaces; ++place)
         drawRow(place);
     drawTitle();
     for (std::size_t i = 0; i < buttons_.size(); ++i)
-        drawButton(i, false);
+        drawButton(i);
 }
 
 void ScoreView::layOut() {
@@ -74,8 +78,9 @@ void ScoreView::drawRow(std::size_t place) {
     drawShadowText(canvas(), box, 1, std::to_string(table.scores[place]), defaultTextFormat);
 }
 
-void ScoreView::drawButton(std::size_t i, bool highlighted) {
+void ScoreView::drawButton(std::size_t i) {
     const auto caption = static_cast<std::uint16_t>(string_ids::scoreViewBase + 1 + i);
+    const bool highlighted = isHighlighted_[i];
     drawLabelledBox(canvas(), buttons_[i], highlighted ? BoxStyle::Framed : BoxStyle::Plain, highlighted,
                     highlighted ? 6 : 4, loadString(caption));
 }
@@ -85,8 +90,8 @@ Task<> ScoreView::Form_MouseMove(float x, float y) {
         const bool over = hitTest(buttons_[i], x, y);
         if (over == buttons_[i].hovered)
             continue;
-        drawButton(i, over);
-        buttons_[i].hovered = over;
+        buttons_[i].hovered = isHighlighted_[i] = over;
+        drawButton(i);
         refresh();
     }
     co_return;
@@ -108,16 +113,11 @@ Task<> ScoreView::Form_KeyPress(std::int16_t key) {
 
 // There is no question first. Which button is hovered stays as it was, though both are drawn at rest.
 void ScoreView::clearScores() {
-    canvas().fill(canvas().bounds(), palette::viewBrush.colour);
-    drawTitle();
     HighScoreTable& table = highScores_.table(modeNum);
-    for (std::size_t place = 0; place < highScorePlaces; ++place) {
-        table.names[place] = clearedName;
-        table.scores[place] = 0;
-        drawRow(place);
-    }
-    for (std::size_t i = 0; i < buttons_.size(); ++i)
-        drawButton(i, false);
+    table.names.fill(clearedName);
+    table.scores.fill(0);
+    isHighlighted_ = {};
+    Form_Paint();
     refresh();
 }
 

@@ -19,6 +19,7 @@ class ScoreView final : public Window {
 
  private:
     void Form_Load() override;
+    void Form_Paint() override;
     bool isClickable(float x, float y) const override {
         return hitTest(buttons_[0], x, y) || hitTest(buttons_[1], x, y);
     }
@@ -32,12 +33,13 @@ class ScoreView final : public Window {
     ScreenButton layOutButton(std::int32_t leftUnits) const;
     void drawTitle();
     void drawRow(std::size_t place);
-    void drawButton(std::size_t i, bool highlighted);
+    void drawButton(std::size_t i);
 
     HighScores& highScores_;
     std::int32_t unit_;
     ScreenButton title_;
     std::array<ScreenButton, 2> buttons_;
+    std::array<bool, 2> isHighlighted_{};  // as they are drawn
 };
 
 }  // namespace quabble

@@ -74,7 +74,8 @@ struct Machine {
     void setBoard(std::string_view rows) {
         game.grid = board(rows);
         MainWindow& window = program.frmQuabble();
-        drawBoard(window.canvas(), {232, cell(1, 1).top, 28}, app.pictures.spriteSheet, game.grid);
+        drawBoard(window.canvas(), {232, cell(1, 1).top, 28}, app.pictures.sprites(window.canvas().scale()),
+                  game.grid);
         window.refresh();
     }
 

@@ -92,7 +92,7 @@ class Robot {
     }
 
     bool showsScore() {
-        Canvas expected({140, 30});
+        Canvas expected({140, 30}, Scale());
         drawLabelledBox(expected,
                         {.width = 140,
                          .height = 30,
@@ -108,7 +108,7 @@ class Robot {
         GameState counted;
         counted.gameMode = mode;
         counted.stats = {.score = score_, .blocksCleared = blocks_, .largestCluster = largest_, .level = 1};
-        Canvas expected({457, 265});
+        Canvas expected({457, 265}, Scale());
         const ScreenButton text{.left = 45,
                                 .top = 45,
                                 .width = 373,
@@ -132,7 +132,7 @@ class Robot {
 
     void checkBestEntry() {
         const WindowOnScreen view = desktop_.waitForWindow("Best Scores - Quabble");
-        Canvas expected({473, 473});
+        Canvas expected({473, 473}, Scale());
         expected.fill(expected.bounds(), palette::backgroundColour);
         ScreenButton box{.left = 45,
                          .top = 45,

@@ -64,7 +64,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         }
         requireSound(box);
     }
-    Canvas canvas({106, 34});
+    Canvas canvas({106, 34}, Scale());
     box.paint(canvas, true);
     return 0;
 }

@@ -3,8 +3,8 @@
 #include "../support/bitmap.hpp"
 #include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
+#include "gfx/pictures.hpp"
 #include "gfx/result_dialog.hpp"
-#include "gfx/sprite_sheet.hpp"
 #include "gfx/string_table.hpp"
 #include "hosts/headless/scripted_user.hpp"
 
@@ -19,7 +19,8 @@ class Painters : public testing::Test {
     }
     Surface sheet{400, 838};  // every pixel is another one
     static constexpr Font font{Typeface::SansBold, 14};
-    Canvas drawn{{360, 470}}, expected = drawn;
+    Canvas drawn{{360, 470}, Scale()};
+    Surface expected{360, 470};
     ScreenButton box{20, 10, 70, 24, false, palette::backgroundBrush, {}, {250, 240, 10}, font};
     CellBox cells{20, 10, 28};
 };
@@ -29,13 +30,13 @@ TEST_F(Painters, ClipEachCopyOfATextToItsOwnRectangle) {
     for (const std::int32_t format : {-1, 1, 4 + 32, 1 + 4 + 32}) {
         const bool label = format == 1 + 4 + 32;
         expected.fill({20, 10, 90, 34}, {62, 105, 214});
-        expected.write({20, 10, 90, 34}, text, std::max(format, 0), font, {});
-        expected.write(label ? Rect{20, 10, 97, 27} : Rect{27, 3, 90, 34}, text, std::max(format, 0), font,
-                       label ? Colour{200, 220, 180} : Colour{250, 240, 10});
+        drawText(expected, Scale(), {20, 10, 90, 34}, text, std::max(format, 0), {}, font);
+        drawText(expected, Scale(), label ? Rect{20, 10, 97, 27} : Rect{27, 3, 90, 34}, text,
+                 std::max(format, 0), label ? Colour{200, 220, 180} : Colour{250, 240, 10}, font);
         drawLabelledBox(drawn, box, BoxStyle::Plain, label, 7, label ? text : "");
         if (!label)
             drawShadowText(drawn, box, 7, text, format);
-        EXPECT_TRUE(drawn.picture() == expected.picture()) << format;
+        EXPECT_TRUE(drawn.picture() == expected) << format;
     }
 }
 
@@ -47,8 +48,8 @@ TEST_F(Painters, CopyTheTilesOfTheBoardAndTheWaitingRow) {
         const Rect square = Rect::ofSize(28 * place.column - 8, 28 * place.row - 18, 28, 28);
         expected.copy(square, sheet, {28 * cell.tile, 0});
     });
-    drawBoard(drawn, cells, sheet, grid);
-    EXPECT_TRUE(drawn.picture() == expected.picture());
+    drawBoard(drawn, cells, spritesOf(sheet, Scale()), grid);
+    EXPECT_TRUE(drawn.picture() == expected);
     sheet.fill({252, 0, 280, 28}, {0x12, 0x34, 0x56});
     sheet.fill({0, 28, 28, 56}, {0, 0, 0xF0});
     for (const auto& [revealed, hidden] : {std::pair{0, 11}, {4, 7}, {10, 1}, {11, 0}}) {
@@ -56,22 +57,23 @@ TEST_F(Painters, CopyTheTilesOfTheBoardAndTheWaitingRow) {
             expected.fill(Rect::ofSize(20 + 28 * i, 10, 28, 28), {0x12, 0x34, 0x56});
         for (std::int32_t i = 0; i < hidden; ++i)
             expected.fill(Rect::ofSize(20 + 28 * i, 10, 28, 28), {0, 0, 0x50});
-        drawPreviewRow(drawn, cells, sheet, GridRow(12, GridCell::bomb(3)),
+        drawPreviewRow(drawn, cells, spritesOf(sheet, Scale()), GridRow(12, GridCell::bomb(3)),
                        static_cast<std::int16_t>(revealed));
-        EXPECT_TRUE(drawn.picture() == expected.picture()) << revealed;
+        EXPECT_TRUE(drawn.picture() == expected) << revealed;
     }
 }
 
 TEST_F(Painters, FillTheGaugeFromTheTopAndCopyNoMoreThanThereIs) {
+    const Sprites sprites = spritesOf(sheet, Scale());
     for (const auto& [part, full] : {std::pair{150., 241}, {99.8, 241}, {99.7, 240}, {50., 120}, {0., 0}}) {
-        expected.copy({20, 10, 90, 10 + 241}, sheet, {246, 29});
-        expected.copy({20, 10, 90, 10 + full}, sheet, {274, 29});
-        drawGauge(drawn, box.rect(), sheet, part);
-        EXPECT_TRUE(drawn.picture() == expected.picture()) << part;
+        expected.copy({20, 10, 50, 10 + 241}, sheet, {246, 29});
+        expected.copy({20, 10, 50, 10 + full}, sheet, {274, 29});
+        drawGauge(drawn, {20, 10, 50, 34}, sprites, part);
+        EXPECT_TRUE(drawn.picture() == expected) << part;
     }
     expected.fill({20, 10, 25, 15}, {});
-    copyPicture(drawn, box.rect(), Surface(5, 5));
-    EXPECT_TRUE(drawn.picture() == expected.picture()) << "a picture smaller than its box";
+    drawn.copy(box.rect(), Surface(5, 5));
+    EXPECT_TRUE(drawn.picture() == expected) << "a picture smaller than its box";
 }
 
 TEST_F(Painters, HaveAStandInForASheetThatCannotBeUsed) {
@@ -79,16 +81,11 @@ TEST_F(Painters, HaveAStandInForASheetThatCannotBeUsed) {
     const auto cutOff = std::vector(good.begin(), good.end() - 1);
     for (const auto& file : {good, aRowLess, cutOff, {}}) {
         HeadlessFrontEnd frontEnd({{"ALLPICDATA.BMP", file}});
-        const Surface loaded = loadGraphics(frontEnd).spriteSheet;
-        if (file == good) {
-            EXPECT_TRUE(loaded == sheet);
-            continue;
-        }
-        ASSERT_GE(loaded.width(), 400);
-        ASSERT_GE(loaded.height(), 838);
-        for (std::int32_t i = 0; i < 14; ++i) {
-            for (std::int32_t j = 0; j < i; ++j)
-                EXPECT_NE(loaded.at(28 * i + 4, 4), loaded.at(28 * j + 4, 4)) << i << " and " << j;
+        const auto tiles = Pictures(frontEnd).sprites(Scale()).tiles;
+        EXPECT_EQ(tiles[13].at(4, 4) == colourOf(4 * 400 + 13 * 28 + 4), file == good);
+        for (std::size_t i = 0; i < tiles.size(); ++i) {
+            for (std::size_t j = 0; j < i; ++j)
+                EXPECT_NE(tiles[i].at(4, 4), tiles[j].at(4, 4)) << i << " and " << j;
         }
     }
 }
@@ -136,13 +133,13 @@ TEST_F(Result, TellsHowTheGameOrLevelEnded) {
 }
 
 TEST_F(Result, ShowsItsLinesWholeAndHighlightsItsButtonUntilItCloses) {
-    Surface expected(457, 265);
+    Canvas expected({457, 265}, Scale());
     using enum EventKind;
     const std::pair<EventKind, short> ways[] = {
         {MouseDown, 0}, {CloseButton, 0}, {KeyPress, 13}, {KeyPress, 27}};
     const float path[][2] = {{230, 234}, {230, 233}, {187, 219}, {186, 219}, {230, 204}, {230, 205}};
     const std::string lines = textOf(GameMode::Strategy, 11, false);
-    drawText(expected, {47, 43, 418, 999}, lines, 1, {180, 180, 140}, {Typeface::Sans, 12});
+    expected.write({47, 43, 418, 999}, lines, 1, {Typeface::Sans, 12}, {180, 180, 140});
     for (const auto& way : ways) {
         Task<> showing = loop.showModal(dialog);
         showing.start();
@@ -155,11 +152,11 @@ TEST_F(Result, ShowsItsLinesWholeAndHighlightsItsButtonUntilItCloses) {
             expected.fill({186, 204, 276, 234}, {62, 105, 214});
             expected.outline({186, 204, 276, 234}, {170, 170, 100});
             expected.outline(over ? Rect{187, 205, 275, 233} : Rect{}, colour);
-            drawText(expected, {186, 204, 276, 234}, "OK", 1 + 4 + 32, {}, {Typeface::Sans, 14});
-            drawText(expected, front, "OK", 1 + 4 + 32, colour, {Typeface::Sans, 14});
+            expected.write({186, 204, 276, 234}, "OK", 1 + 4 + 32, {Typeface::Sans, 14}, {});
+            expected.write(front, "OK", 1 + 4 + 32, {Typeface::Sans, 14}, colour);
             user.movePointer(x, y);
             EXPECT_EQ(user.top().timesShown, timesShown) << x << "," << y;
-            EXPECT_TRUE(user.top().picture == expected) << x << "," << y;
+            EXPECT_TRUE(user.top().picture == expected.picture()) << x << "," << y;
             loop.post({user.topWindow(), over ? KeyPress : MouseDown, x, y, 'o'});
         }
         loop.post({user.topWindow(), way.first, 186.5F, 204.5F, way.second});

@@ -72,7 +72,7 @@ TEST(TextBox, EditsALine) {
 
 // The column of the caret, the one dark line of full height; -1 when it is not to be seen.
 int caretColumn(const TextBox& box) {
-    Canvas canvas({box.area.right, box.area.bottom});
+    Canvas canvas({box.area.right, box.area.bottom}, Scale());
     box.paint(canvas, true);
     const Surface& seen = canvas.picture();
     for (int x = 4; x < seen.width() - 4; ++x) {
@@ -149,7 +149,7 @@ TEST(TextBox, MarksWhatIsSelected) {
     const int end = caretColumn(box);
     press(box, 30, true);
     const int start = caretColumn(box);
-    Canvas canvas({100, 28});
+    Canvas canvas({100, 28}, Scale());
     box.paint(canvas, false);
     const Surface& seen = canvas.picture();
     for (int x = 6; x < 94; ++x)

@@ -26,20 +26,20 @@ Rect workArea() {
 }  // namespace
 
 DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* owner)
-    : clientSize_(traits.clientSize) {
+    : traits_(traits), owner_(owner) {
     const bool isDialog = owner != nullptr;
     SDL_SetHint(SDL_HINT_X11_WINDOW_TYPE, isDialog ? "_NET_WM_WINDOW_TYPE_DIALOG" : "");
     const Uint32 flags = SDL_WINDOW_HIDDEN | SDL_WINDOW_ALLOW_HIGHDPI |
                          (isDialog ? Uint32{SDL_WINDOW_SKIP_TASKBAR} : 0U) |
                          (traits.borderless ? Uint32{SDL_WINDOW_BORDERLESS} : 0U);
-    window_.reset(
-        SDL_CreateWindow(traits.caption.c_str(), 0, 0, clientSize_.width, clientSize_.height, flags));
+    window_.reset(SDL_CreateWindow(traits.caption.c_str(), 0, 0, traits.clientSize.width,
+                                   traits.clientSize.height, flags));
     if (!window_)
         return;
-    scale_ = isDialog ? owner->scale_ : scaleOf(traits);
-    const Size size = scaled(clientSize_, scale_);
+    setFactor(wantedFactor());
+    const Size size = sizeAtScale();
     SDL_SetWindowSize(sdl(), size.width, size.height);
-    const Point position = positionOf(traits, owner);
+    const Point position = wantedPosition();
     SDL_SetWindowPosition(sdl(), position.x, position.y);
     if (isDialog)
         SDL_SetWindowModalFor(sdl(), owner->sdl());
@@ -65,33 +65,68 @@ DesktopWindow::~DesktopWindow() {
     x11->waitForServer();
 }
 
-// Where the desktop scales windows by itself, on Wayland, it says so by the size of the window's surface.
-double DesktopWindow::scaleOf(const NativeWindow& traits) const {
+// Where the desktop scales windows by itself, on Wayland, it says so by the pixels that a window has.
+double DesktopWindow::wantedFactor() const {
+    if (owner_ != nullptr)
+        return owner_->factor_;
     const auto x11 = X11Window::of(sdl());
-    if (!x11)
-        return 1;
+    if (!x11) {
+        Size pixels;
+        SDL_GetWindowSizeInPixels(sdl(), &pixels.width, &pixels.height);
+        return std::max(1.0, static_cast<double>(pixels.width) / size().width);
+    }
     const Rect area = workArea();
-    const Size frame = traits.borderless ? Size{} : Window::nominalFrame;
-    return scaleFor(x11->dotsPerInch().value_or(plainDotsPerInch), clientSize_,
+    const Size frame = traits_.borderless ? Size{} : Window::nominalFrame;
+    return scaleFor(x11->dotsPerInch().value_or(plainDotsPerInch), traits_.clientSize,
                     {area.width() - frame.width, area.height() - frame.height});
 }
 
+void DesktopWindow::setFactor(double factor) {
+    factor_ = factor;
+    scale_ = Scale::nearest(factor);
+}
+
+// In the desktop's coordinates.
+Size DesktopWindow::sizeAtScale() const {
+    if (!X11Window::of(sdl()))
+        return traits_.clientSize;
+    return factor_ < 1 ? scaled(traits_.clientSize, factor_) : scale_.device(traits_.clientSize);
+}
+
+// The middle of the window's upper edge stays where it is.
+bool DesktopWindow::followScale() {
+    const double factor = window_ ? wantedFactor() : factor_;
+    if (factor == factor_)
+        return false;
+    const Size before = size();
+    setFactor(factor);
+    const Size now = sizeAtScale();
+    if (now == before)
+        return true;
+    Point corner;
+    SDL_GetWindowPosition(sdl(), &corner.x, &corner.y);
+    SDL_SetWindowSize(sdl(), now.width, now.height);
+    SDL_SetWindowPosition(sdl(), std::max(corner.x + (before.width - now.width) / 2, workArea().left),
+                          corner.y);
+    return true;
+}
+
 // A place that the program asks for is meant for an unscaled window: the middle of its upper edge stays.
-Point DesktopWindow::positionOf(const NativeWindow& traits, const DesktopWindow* owner) const {
+Point DesktopWindow::wantedPosition() const {
     const Size own = size();
-    if (traits.position) {
+    if (traits_.position) {
         SDL_Rect screen{};
         SDL_GetDisplayBounds(0, &screen);
-        const std::int32_t left = screen.x + traits.position->x + (clientSize_.width - own.width) / 2;
-        return {std::max(left, workArea().left), screen.y + traits.position->y};
+        const std::int32_t left = screen.x + traits_.position->x + (traits_.clientSize.width - own.width) / 2;
+        return {std::max(left, workArea().left), screen.y + traits_.position->y};
     }
-    if (owner == nullptr) {
+    if (owner_ == nullptr) {
         return {static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED),
                 static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED)};
     }
     Point corner;
-    SDL_GetWindowPosition(owner->sdl(), &corner.x, &corner.y);
-    const Size around = owner->size();
+    SDL_GetWindowPosition(owner_->sdl(), &corner.x, &corner.y);
+    const Size around = owner_->size();
     return {corner.x + (around.width - own.width) / 2, corner.y + (around.height - own.height) / 2};
 }
 
@@ -130,8 +165,9 @@ void DesktopWindow::showAgain() {
 }
 
 Magnifier& DesktopWindow::magnifierFor(const Surface& picture, Size shown) {
-    if (magnifier_.shownSize() != shown)
-        magnifier_ = Magnifier({picture.width(), picture.height()}, shown);
+    const Size own{picture.width(), picture.height()};
+    if (magnifier_.shownSize() != shown || magnifier_.pictureSize() != own)
+        magnifier_ = Magnifier(own, shown);
     return magnifier_;
 }
 
@@ -160,19 +196,19 @@ void DesktopWindow::takeKeyboard() const {
 }
 
 Point DesktopWindow::programPixel(Point place) const {
-    return pixelSeenAt(place, size(), clientSize_);
+    return scale_.pixelAt(pixelSeenAt(place, size(), scale_.device(traits_.clientSize)));
 }
 
 Rect DesktopWindow::placeOf(const Rect& programPixels) const {
     const Size own = size();
-    const auto across = [&](std::int32_t x) { return x * own.width / clientSize_.width; };
-    const auto down = [&](std::int32_t y) { return y * own.height / clientSize_.height; };
+    const auto across = [&](std::int32_t x) { return x * own.width / traits_.clientSize.width; };
+    const auto down = [&](std::int32_t y) { return y * own.height / traits_.clientSize.height; };
     return {across(programPixels.left), down(programPixels.top), across(programPixels.right),
             down(programPixels.bottom)};
 }
 
 Size DesktopWindow::size() const {
-    Size size = clientSize_;
+    Size size = traits_.clientSize;
     SDL_GetWindowSize(sdl(), &size.width, &size.height);
     return size;
 }

@@ -13,8 +13,8 @@ struct SDL_Surface;
 
 namespace quabble {
 
-// A window of the desktop and the picture it shows, as large as the desktop's scale asks for. A dialog takes
-// over its owner's scale.
+// A window of the desktop and the picture it shows, one to one, at the desktop's scale. A dialog has its
+// owner's. Only where the screen is too small for a window at scale 1 its picture is brought down.
 class DesktopWindow {
  public:
     DesktopWindow(const NativeWindow& traits, const DesktopWindow* owner);
@@ -26,8 +26,13 @@ class DesktopWindow {
     SDL_Window* sdl() const { return window_.get(); }
     std::uint32_t sdlId() const;  // 0 when the desktop had no window to give
 
-    // Shows a picture of the window's client size, which must stay until the next one or the window's end.
-    // The first one brings the window onto the screen.
+    // At which its pictures are wanted.
+    Scale scale() const { return scale_; }
+    // Takes over the desktop's scale; true when it is another than before.
+    bool followScale();
+
+    // Shows a picture of the window's client size, at whatever scale, which must stay until the next one or
+    // the window's end. The first one brings the window onto the screen.
     void show(const Surface& picture);
     // A window that was uncovered, restored or resized gets its picture again.
     void showAgain();
@@ -45,8 +50,10 @@ class DesktopWindow {
 
  private:
     Size size() const;  // in the desktop's coordinates
-    double scaleOf(const NativeWindow& traits) const;
-    Point positionOf(const NativeWindow& traits, const DesktopWindow* owner) const;
+    double wantedFactor() const;
+    void setFactor(double factor);
+    Size sizeAtScale() const;
+    Point wantedPosition() const;
     Magnifier& magnifierFor(const Surface& picture, Size shown);
     void fill(SDL_Surface& screen, const Surface& picture);
 
@@ -54,8 +61,10 @@ class DesktopWindow {
         void operator()(SDL_Window* window) const;
     };
     std::unique_ptr<SDL_Window, Destroy> window_;
-    Size clientSize_;
-    double scale_ = 1;
+    NativeWindow traits_;
+    const DesktopWindow* owner_;
+    double factor_ = 1;  // less than 1 only to fit
+    Scale scale_;
     const Surface* picture_ = nullptr;
     std::unique_ptr<SharedPicture> shared_;  // or else it is shown by SDL's window surface
     Magnifier magnifier_;

@@ -133,6 +133,9 @@ void SdlFrontEnd::take(const SDL_Event& event, Program& program) {
         if (shown != nullptr)
             shown->showAgain();
     }
+    if (event.type == SDL_WINDOWEVENT && (event.window.event == SDL_WINDOWEVENT_DISPLAY_CHANGED ||
+                                          event.window.event == SDL_WINDOWEVENT_SIZE_CHANGED))
+        followScale(program);
     if (event.type == SDL_WINDOWEVENT &&
         (event.window.event == SDL_WINDOWEVENT_FOCUS_GAINED || event.window.event == SDL_WINDOWEVENT_SHOWN))
         handOnKeyboard(program);
@@ -175,6 +178,9 @@ void SdlFrontEnd::take(const X11Event& event, Program& program) {
         case X11Event::Kind::KeyReleased:
             heldKeys_.release(event.key);
             break;
+        case X11Event::Kind::ResourcesChanged:
+            followScale(program);
+            break;
         case X11Event::Kind::WindowDestroyed:
             if (const WindowId window = idOfX11(event.window); window != WindowId::none)
                 lose(window, program);
@@ -192,13 +198,25 @@ void SdlFrontEnd::lose(WindowId window, Program& program) {
         end(program);
 }
 
-void SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
+Scale SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
     auto made = std::make_unique<DesktopWindow>(traits, find(traits.owner));
-    if (made->sdl() != nullptr) {
-        windows_[window] = std::move(made);
-    } else {
+    if (made->sdl() == nullptr) {
         std::fprintf(stderr, "Quabble cannot open a window: %s\n", SDL_GetError());
         unopened_.push_back(window);
+        return {};
+    }
+    if (const auto x11 = X11Window::of(made->sdl()); x11 && windows_.empty())
+        x11->listenToResources();
+    const Scale scale = made->scale();
+    windows_[window] = std::move(made);
+    return scale;
+}
+
+// An owner comes before its dialogs.
+void SdlFrontEnd::followScale(Program& program) {
+    for (const auto& [window, shown] : windows_) {
+        if (shown->followScale())
+            program.post({.window = window, .kind = EventKind::Rescaled, .scale = shown->scale()});
     }
 }
 

@@ -32,7 +32,7 @@ class SdlFrontEnd final : public FrontEnd {
     void run(Program& program);
 
     TimePoint now() override { return Clock::now(); }
-    void createWindow(WindowId window, const NativeWindow& traits) override;
+    Scale createWindow(WindowId window, const NativeWindow& traits) override;
     void showPixels(WindowId window, const Surface& picture) override;
     void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
@@ -56,6 +56,7 @@ class SdlFrontEnd final : public FrontEnd {
     void handOnKeyboard(const Program& program);
     void take(const X11Event& event, Program& program);
     void lose(WindowId window, Program& program);
+    void followScale(Program& program);
 
     std::map<WindowId, std::unique_ptr<DesktopWindow>> windows_;
     std::vector<WindowId> unopened_;  // for want of a place on the desktop; they close at once

@@ -2,8 +2,15 @@
 
 namespace quabble {
 
-void HeadlessFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
-    windows_[window] = {traits, Surface(traits.clientSize.width, traits.clientSize.height)};
+Scale HeadlessFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
+    windows_[window] = {.traits = traits, .picture = {}};
+    return scale;
+}
+
+void HeadlessFrontEnd::rescale(Scale wanted) {
+    scale = wanted;
+    for (const auto& [window, shown] : windows_)
+        post_({.window = window, .kind = EventKind::Rescaled, .scale = wanted});
 }
 
 void HeadlessFrontEnd::showPixels(WindowId window, const Surface& picture) {

@@ -32,7 +32,7 @@ class HeadlessFrontEnd final : public FrontEnd {
     void connect(std::function<void(const InputEvent&)> post) { post_ = std::move(post); }
 
     TimePoint now() override { return now_; }
-    void createWindow(WindowId window, const NativeWindow& traits) override;
+    Scale createWindow(WindowId window, const NativeWindow& traits) override;
     void showPixels(WindowId window, const Surface& picture) override;
     void closeWindow(WindowId window) override { windows_.erase(window); }
     void minimiseWindow(WindowId window) override;
@@ -47,6 +47,11 @@ class HeadlessFrontEnd final : public FrontEnd {
 
     std::vector<std::string> openedDocuments;
     std::string clipboard;  // UTF-8
+
+    Scale scale;  // of the windows that are made
+
+    // Another scale is wanted of all windows from now on.
+    void rescale(Scale wanted);
 
     void advanceTo(TimePoint time) { now_ = std::max(now_, time); }
     void restoreWindow(WindowId window);

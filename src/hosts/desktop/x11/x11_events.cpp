@@ -1,6 +1,7 @@
 #include "hosts/desktop/x11/x11_events.hpp"
 
 #include <SDL2/SDL_syswm.h>
+#include <X11/Xatom.h>
 
 namespace quabble {
 namespace {
@@ -34,6 +35,10 @@ std::optional<X11Event> translateX11(const SDL_Event& event) {
             return X11Event{.kind = Kind::KeyReleased, .window = x11.xkey.window, .key = x11.xkey.keycode};
         case DestroyNotify:
             return X11Event{.kind = Kind::WindowDestroyed, .window = x11.xdestroywindow.window};
+        case PropertyNotify:
+            if (x11.xproperty.atom == XA_RESOURCE_MANAGER)
+                return X11Event{.kind = Kind::ResourcesChanged};
+            return std::nullopt;
         default:
             return std::nullopt;
     }

@@ -15,7 +15,8 @@ struct X11Event {
         KeysDown,
         KeyPressed,  // or repeated
         KeyReleased,
-        WindowDestroyed  // by whomever
+        WindowDestroyed,  // by whomever
+        ResourcesChanged  // the user's, of which one is the scale
     };
     Kind kind;
     unsigned long window = 0;  // the server's number

@@ -84,6 +84,13 @@ std::optional<double> X11Window::dotsPerInch() const {
     return isSensible ? std::optional(dots) : std::nullopt;
 }
 
+// SDL may have asked the same window for other events.
+void X11Window::listenToResources() const {
+    XWindowAttributes root{};
+    XGetWindowAttributes(display_, DefaultRootWindow(display_), &root);
+    XSelectInput(display_, DefaultRootWindow(display_), root.your_event_mask | PropertyChangeMask);
+}
+
 // The format is that of the Motif window manager, which most have taken over.
 void X11Window::haveOnlyCloseButton() const {
     constexpr long functionsAndDecorations = 1 | 2;

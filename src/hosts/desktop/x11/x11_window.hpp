@@ -30,6 +30,8 @@ class X11Window {
     int connection() const;  // the descriptor of the connection to the server
     // The user's dots per inch of texts (the X resource Xft.dpi), if any are set.
     std::optional<double> dotsPerInch() const;
+    // Lets the server report when the user's resources change.
+    void listenToResources() const;
     // Takes the buttons to minimise and maximise off a dialog's frame: its owner could not bring it back.
     void haveOnlyCloseButton() const;
     // Tells the window manager of a dialog that is not shown yet: its owner takes no keyboard meanwhile.
