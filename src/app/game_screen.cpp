@@ -57,7 +57,10 @@ void GameScreen::paint() {
     panel().drawAgain(window_.canvas());
     drawValues();
     drawPlayPanel();
+    const auto points = points_;
     drawBoard();
+    if (points)
+        drawPoints(points->place, points->points);
     if (shown_ == Shown::ArcadeGame) {
         drawPreviewRow(revealed_);
         drawGauge(percentage_);
@@ -119,6 +122,7 @@ void GameScreen::drawPlayPanel() {
 }
 
 void GameScreen::drawBoard() {
+    points_.reset();
     quabble::drawBoard(window_.canvas(), boardBox_, sprites(), app_.game.grid);
 }
 
@@ -128,6 +132,7 @@ void GameScreen::drawCell(CellPosition place, std::int16_t tile) {
 }
 
 void GameScreen::drawPoints(CellPosition place, std::int32_t points) {
+    points_ = {place, points};
     const Rect cell = boardBox_.cell(place.column - 1, place.row - 1);
     const ScreenButton label{.left = cell.left,
                              .top = cell.top,

@@ -95,10 +95,15 @@ class GameScreen final : public Stage {
         std::int32_t level = 0;
         bool isLevelHighlighted = false;
     };
+    struct Points {
+        CellPosition place;
+        std::int32_t points = 0;
+    };
     Shown shown_ = Shown::Nothing;
     Figures figures_;
-    std::int16_t revealed_ = 0;  // of the waiting row
-    double percentage_ = 0;      // of the gauge
+    std::int16_t revealed_ = 0;     // of the waiting row
+    double percentage_ = 0;         // of the gauge
+    std::optional<Points> points_;  // on the board, until it is drawn again
 
     ButtonPanel standardBtns_;
     ButtonPanel arcadeBtns_;

@@ -103,6 +103,8 @@ class Monkey {
             EXPECT_FALSE(paused);
         }
         EXPECT_EQ(results_.size(), gamesEnded_);
+        if (upTo(50) == 0)
+            checkPainting();
         if (!settled)
             return;
         EXPECT_EQ(screens, 1);
@@ -114,6 +116,17 @@ class Monkey {
             checkMenu();
         else
             checkBoard();
+    }
+
+    // A window that is painted whole, as at another scale and back, shows what it has shown.
+    void checkPainting() {
+        const auto before = machine_->frontEnd.windows();
+        for (const Scale scale : {Scale::ofQuarters(6), Scale()}) {
+            machine_->frontEnd.rescale(scale);
+            machine_->program.wake();
+        }
+        for (const auto& [window, shown] : machine_->frontEnd.windows())
+            EXPECT_TRUE(shown.picture == before.at(window).picture) << shown.traits.caption;
     }
 
     // Right of the menu's buttons only the background is seen, whatever board is beneath.

@@ -1,5 +1,6 @@
 #include "desktop.hpp"
 
+#include <X11/Xatom.h>
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
 #include <X11/extensions/XTest.h>
@@ -80,12 +81,26 @@ bool Desktop::isVisible(::Window window) {
     return found;
 }
 
+void Desktop::setScale(Scale scale) {
+    const std::string resources = "Xft.dpi: " + std::to_string(24 * scale.quarters()) + "\n";
+    XChangeProperty(display_, root_, XA_RESOURCE_MANAGER, XA_STRING, 8, PropModeReplace,
+                    reinterpret_cast<const unsigned char*>(resources.data()),
+                    static_cast<int>(resources.size()));
+    XSync(display_, False);
+    scale_ = scale;
+}
+
 void Desktop::click(::Window window, int x, int y, int times) {
+    const Rect pixel = scale_.device(Rect::ofSize(x, y, 1, 1));
+    clickAt(window, {pixel.left, pixel.top}, times);
+}
+
+void Desktop::clickAt(::Window window, Point place, int times) {
     std::this_thread::sleep_for(reactionTime);
     int screenX = 0;
     int screenY = 0;
     ::Window child = None;
-    XTranslateCoordinates(display_, window, root_, x, y, &screenX, &screenY, &child);
+    XTranslateCoordinates(display_, window, root_, place.x, place.y, &screenX, &screenY, &child);
     XTestFakeMotionEvent(display_, -1, screenX, screenY, CurrentTime);
     for (int i = 0; i < times; ++i) {
         if (i > 0)
@@ -115,7 +130,7 @@ void Desktop::offerUnknownDrop(::Window window) {
 void Desktop::clickCloseButton(::Window window) {
     XWindowAttributes attributes{};
     XGetWindowAttributes(display_, window, &attributes);
-    click(window, attributes.width - 10, -10);
+    clickAt(window, {attributes.width - 10, -10}, 1);
 }
 
 void Desktop::press(KeySym keysym, std::chrono::milliseconds howLong) {

@@ -4,6 +4,7 @@
 #include <functional>
 #include <string>
 
+#include "draw/scale.hpp"
 #include "draw/surface.hpp"
 
 struct _XDisplay;
@@ -26,7 +27,11 @@ class Desktop {
 
     bool isVisible(WindowOnScreen window);
 
-    void click(WindowOnScreen window, int x, int y, int times = 1);
+    // That the programs find when they start: 96 dots per inch are 1.
+    void setScale(Scale scale);
+    Scale scale() const { return scale_; }
+
+    void click(WindowOnScreen window, int x, int y, int times = 1);  // in the program's pixels
     void clickCloseButton(WindowOnScreen window);
     // As at the beginning of a drop, of a kind of thing that has no name.
     void offerUnknownDrop(WindowOnScreen window);
@@ -41,15 +46,17 @@ class Desktop {
     void type(const std::string& lowerCaseLetters);
     void waitForFocus(WindowOnScreen window);
 
-    // What is seen of a window's client area.
+    // What is seen of a window's client area, in the screen's pixels.
     Surface look(WindowOnScreen window);
 
  private:
     WindowOnScreen find(WindowOnScreen below, const std::string& caption);
+    void clickAt(WindowOnScreen window, Point place, int times);  // in the screen's pixels
     void askWindowManager(WindowOnScreen window, const char* what, long first);
 
     _XDisplay* display_;
     WindowOnScreen root_;
+    Scale scale_;
 };
 
 // Asks again and again until the answer is yes; fails the run when it is not within ten seconds.

@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <chrono>
 #include <cstdio>
+#include <cstdlib>
 #include <string>
 #include <thread>
 #include <utility>
@@ -27,6 +28,12 @@ class Robot {
  public:
     explicit Robot(std::string program) : game_(desktop_, std::move(program)) {}
 
+    void setScale(Scale scale) { desktop_.setScale(scale); }
+    // Lets the program keep its scores elsewhere from now on.
+    static void forgetScores(int place) {
+        const std::string data = std::getenv("XDG_DATA_HOME") + ("/" + std::to_string(place));
+        setenv("XDG_DATA_HOME", data.c_str(), 1);
+    }
     void startProgram() { game_.start(); }
 
     // Plays one game and leaves it at `moves` moves, or when it has ended by itself.
@@ -92,15 +99,22 @@ class Robot {
     }
 
     bool showsScore() {
-        Canvas expected({140, 30}, Scale());
-        drawLabelledBox(expected,
-                        {.width = 140,
-                         .height = 30,
-                         .fillBrush = palette::backgroundBrush,
-                         .textColour = palette::valueColour,
-                         .font = {Typeface::SansBold, 14}},
-                        BoxStyle::Plain, false, 2, std::to_string(score_));
-        return partOf(game_.look(), Rect::ofSize(25, 240, 140, 30)) == expected.picture();
+        Canvas expected({675, 562}, desktop_.scale());
+        const ScreenButton box{.left = 25,
+                               .top = 240,
+                               .width = 140,
+                               .height = 30,
+                               .fillBrush = palette::backgroundBrush,
+                               .textColour = palette::valueColour,
+                               .font = {Typeface::SansBold, 14}};
+        drawLabelledBox(expected, box, BoxStyle::Plain, false, 2, std::to_string(score_));
+        return isSeen(game_.window(), expected, box.rect());
+    }
+
+    // Whether a part of a window, in the program's pixels, is as it was drawn.
+    bool isSeen(WindowOnScreen window, const Canvas& drawn, const Rect& part) {
+        const Rect seen = desktop_.scale().device(part);
+        return partOf(desktop_.look(window), seen) == partOf(drawn.picture(), seen);
     }
 
     void checkResult(GameMode mode) {
@@ -108,7 +122,7 @@ class Robot {
         GameState counted;
         counted.gameMode = mode;
         counted.stats = {.score = score_, .blocksCleared = blocks_, .largestCluster = largest_, .level = 1};
-        Canvas expected({457, 265}, Scale());
+        Canvas expected({457, 265}, desktop_.scale());
         const ScreenButton text{.left = 45,
                                 .top = 45,
                                 .width = 373,
@@ -116,9 +130,7 @@ class Robot {
                                 .textColour = palette::panelTextColour,
                                 .font = {Typeface::Sans, 12}};
         drawShadowText(expected, text, 2, resultText(counted, false), text_format::centre);
-        waitUntil("the result as counted", [&] {
-            return partOf(desktop_.look(dialog), text.rect()) == partOf(expected.picture(), text.rect());
-        });
+        waitUntil("the result as counted", [&] { return isSeen(dialog, expected, text.rect()); });
         desktop_.waitForFocus(dialog);
         desktop_.press(XK_Return);
         waitUntil("the dialog's end", [this] { return !hasEnded(); });
@@ -132,7 +144,7 @@ class Robot {
 
     void checkBestEntry() {
         const WindowOnScreen view = desktop_.waitForWindow("Best Scores - Quabble");
-        Canvas expected({473, 473}, Scale());
+        Canvas expected({473, 473}, desktop_.scale());
         expected.fill(expected.bounds(), palette::backgroundColour);
         ScreenButton box{.left = 45,
                          .top = 45,
@@ -143,9 +155,7 @@ class Robot {
         drawShadowText(expected, box, 1, playerName, defaultTextFormat);
         box.left = 360;
         drawShadowText(expected, box, 1, std::to_string(score_), defaultTextFormat);
-        const Rect seen{45, 45, 450, 90};
-        waitUntil("the best score and its name",
-                  [&] { return partOf(desktop_.look(view), seen) == partOf(expected.picture(), seen); });
+        waitUntil("the best score and its name", [&] { return isSeen(view, expected, {45, 45, 450, 90}); });
         desktop_.waitForFocus(view);
         desktop_.press(XK_Return);
         waitUntil("the view's end", [this] { return !desktop_.hasWindow("Best Scores - Quabble"); });
@@ -172,5 +182,12 @@ int main(int argc, char** argv) {
     robot.startProgram();
     robot.checkTable(quabble::GameMode::Timed);
     robot.closeAndCheckExit();
+    for (const int quarters : {6, 8}) {
+        robot.setScale(quabble::Scale::ofQuarters(quarters));
+        robot.forgetScores(quarters);
+        robot.startProgram();
+        robot.play(quabble::GameMode::Training, quarters == 6 ? 5 : 1000);
+        robot.closeAndCheckExit();
+    }
     return 0;
 }

@@ -10,7 +10,7 @@
 
 #include "../engine/board_notation.hpp"
 #include "../support/files.hpp"
-#include "gfx/painters.hpp"
+#include "draw/png_file.hpp"
 #include "gfx/palette.hpp"
 
 namespace quabble {
@@ -24,13 +24,16 @@ constexpr int boardLeft = 232;
 }  // namespace
 
 RunningGame::RunningGame(Desktop& desktop, std::string program)
-    : desktop_(desktop), program_(std::move(program)) {
-    const Surface sheet = readPicture(std::filesystem::path(program_).parent_path() / "ALLPICDATA.BMP");
-    for (int tile = 0; tile < tiles::count; ++tile)
-        tiles_.push_back(partOf(sheet, Rect::ofSize(cellSize * tile, 0, cellSize, cellSize)));
-}
+    : desktop_(desktop), program_(std::move(program)) {}
 
 void RunningGame::start() {
+    const std::filesystem::path folder = std::filesystem::path(program_).parent_path();
+    if (desktop_.scale() == Scale()) {
+        tiles_ = spritesOf(readPicture(folder / "ALLPICDATA.BMP"), Scale()).tiles;
+    } else {
+        const std::string large = bytesOf(folder / "ALLPICDATA.PNG");
+        tiles_ = spritesOf(*decodePng(std::as_bytes(std::span(large))), 4, desktop_.scale()).tiles;
+    }
     process_ = fork();
     if (process_ == 0) {
         execl(program_.c_str(), program_.c_str(), nullptr);
@@ -71,7 +74,7 @@ std::string RunningGame::readBoard() {
     const Surface window = look();
     std::string letters;
     for (int i = 0; i < 192; ++i) {
-        const Surface seen = partOf(window, cellAt(i % 12, i / 12));
+        const Surface seen = partOf(window, desktop_.scale().device(cellAt(i % 12, i / 12)));
         const auto tile = std::ranges::find(tiles_, seen) - tiles_.begin();
         letters += tile < std::ssize(tiles_) ? tileLetters[static_cast<std::size_t>(tile)] : '?';
     }

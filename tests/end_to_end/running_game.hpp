@@ -2,12 +2,13 @@
 
 #include <sys/types.h>
 
+#include <array>
 #include <string>
-#include <vector>
 
 #include "desktop.hpp"
 #include "draw/surface.hpp"
 #include "engine/game_state.hpp"
+#include "gfx/sprites.hpp"
 
 namespace quabble {
 
@@ -22,7 +23,7 @@ class RunningGame {
  public:
     RunningGame(Desktop& desktop, std::string program);
 
-    // Comes back when the main menu is there and has the keyboard.
+    // Comes back when the main menu is there and has the keyboard. The desktop's scale is set before.
     void start();
     // Chooses a button of the main menu, counted from 1.
     void choose(int button, int clicks = 1);
@@ -33,14 +34,15 @@ class RunningGame {
     WindowOnScreen window() const { return window_; }
     pid_t process() const { return process_; }
     Surface look() { return desktop_.look(window_); }
-    Rect cellAt(int column, int row) const;  // counted from 0
+    // A cell, counted from 0, in the program's pixels.
+    Rect cellAt(int column, int row) const;
     // The letters of the board as it is seen, '?' for cells that cannot be read.
     std::string readBoard();
 
  private:
     Desktop& desktop_;
     std::string program_;
-    std::vector<Surface> tiles_;
+    std::array<Surface, tiles::count> tiles_;
     pid_t process_ = 0;
     WindowOnScreen window_ = 0;
     GameMode mode_ = GameMode::Training;
