@@ -39,8 +39,7 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
     setFactor(wantedFactor());
     const Size size = sizeAtScale();
     SDL_SetWindowSize(sdl(), size.width, size.height);
-    const Point position = wantedPosition();
-    SDL_SetWindowPosition(sdl(), position.x, position.y);
+    moveTo(wantedPosition());
     if (isDialog)
         SDL_SetWindowModalFor(sdl(), owner->sdl());
     if (const auto x11 = X11Window::of(sdl())) {
@@ -81,6 +80,15 @@ double DesktopWindow::wantedFactor() const {
                     {area.width() - frame.width, area.height() - frame.height});
 }
 
+// Before the window is shown SDL would wait ten milliseconds for the answer that it has moved.
+void DesktopWindow::moveTo(Point corner) {
+    const auto x11 = X11Window::of(sdl());
+    if (x11 && !isOpened_)
+        x11->moveTo(corner);
+    else
+        SDL_SetWindowPosition(sdl(), corner.x, corner.y);
+}
+
 void DesktopWindow::setFactor(double factor) {
     factor_ = factor;
     scale_ = Scale::nearest(factor);
@@ -106,8 +114,7 @@ bool DesktopWindow::followScale() {
     Point corner;
     SDL_GetWindowPosition(sdl(), &corner.x, &corner.y);
     SDL_SetWindowSize(sdl(), now.width, now.height);
-    SDL_SetWindowPosition(sdl(), std::max(corner.x + (before.width - now.width) / 2, workArea().left),
-                          corner.y);
+    moveTo({std::max(corner.x + (before.width - now.width) / 2, workArea().left), corner.y});
     return true;
 }
 
@@ -121,8 +128,9 @@ Point DesktopWindow::wantedPosition() const {
         return {std::max(left, workArea().left), screen.y + traits_.position->y};
     }
     if (owner_ == nullptr) {
-        return {static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED),
-                static_cast<std::int32_t>(SDL_WINDOWPOS_CENTERED)};
+        SDL_Rect screen{};
+        SDL_GetDisplayBounds(0, &screen);
+        return {screen.x + (screen.w - own.width) / 2, screen.y + (screen.h - own.height) / 2};
     }
     Point corner;
     SDL_GetWindowPosition(owner_->sdl(), &corner.x, &corner.y);

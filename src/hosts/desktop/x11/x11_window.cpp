@@ -91,6 +91,10 @@ void X11Window::listenToResources() const {
     XSelectInput(display_, DefaultRootWindow(display_), root.your_event_mask | PropertyChangeMask);
 }
 
+void X11Window::moveTo(Point corner) const {
+    XMoveWindow(display_, window_, corner.x, corner.y);
+}
+
 // The format is that of the Motif window manager, which most have taken over.
 void X11Window::haveOnlyCloseButton() const {
     constexpr long functionsAndDecorations = 1 | 2;

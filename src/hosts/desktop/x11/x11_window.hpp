@@ -4,6 +4,7 @@
 #include <optional>
 #include <span>
 
+#include "draw/geometry.hpp"
 #include "hosts/desktop/x11/icon.hpp"
 
 struct SDL_Window;
@@ -32,6 +33,8 @@ class X11Window {
     std::optional<double> dotsPerInch() const;
     // Lets the server report when the user's resources change.
     void listenToResources() const;
+    // Comes back before it has happened.
+    void moveTo(Point corner) const;
     // Takes the buttons to minimise and maximise off a dialog's frame: its owner could not bring it back.
     void haveOnlyCloseButton() const;
     // Tells the window manager of a dialog that is not shown yet: its owner takes no keyboard meanwhile.
