@@ -177,16 +177,37 @@ class DesktopBench {
     DesktopBench(std::string program, std::string bareWindow)
         : program_(std::move(program)), bareWindow_(std::move(bareWindow)) {}
 
-    void measureStart() {
+    void measureStart(Scale scale, Goal goal) {
+        const Size splash = scale.device(Size{680, 450});
+        const std::vector<std::string> bareCommand{bareWindow_, std::to_string(splash.width),
+                                                   std::to_string(splash.height)};
+        desktop_.setScale(scale);
         timeToFirstPixel({program_});  // makes the user's registry
         std::vector<double> ours;
         std::vector<double> bare;
         for (int i = 0; i < 15; ++i) {
             ours.push_back(timeToFirstPixel({program_}));
-            bare.push_back(timeToFirstPixel({bareWindow_, "680", "450"}));
+            bare.push_back(timeToFirstPixel(bareCommand));
         }
-        report("exec to the splash's first pixel | bare window", median(ours), median(bare), "ms",
-               {.times = 1.5});
+        desktop_.setScale(Scale());
+        report("exec to the splash's first pixel" + atScale(scale) + " | bare window", median(ours),
+               median(bare), "ms", goal);
+    }
+
+    // Against what it takes at scale 1 and the pixels that are more, of the window and of the sprites.
+    void measureMemoryAt(Scale scale) {
+        desktop_.setScale(scale);
+        const Process process({program_});
+        desktop_.waitForWindow(mainCaption);
+        std::this_thread::sleep_for(3s);
+        desktop_.setScale(Scale());
+        const auto pixels = [](Size size) { return static_cast<double>(size.width) * size.height; };
+        double added = 0;
+        for (const Size size : {Size{675, 562}, Size{400, 500}, Size{28 * 28, 28}, Size{60, 241}})
+            added += pixels(scale.device(size)) - pixels(size);
+        report("memory (Pss) at the main menu" + atScale(scale) + " | at scale 1",
+               process.proportionalSetSize() / 1024, plainSize_ / 1024, "MiB",
+               {.more = 1.3 * added * sizeof(std::uint32_t) / (1 << 20)});
     }
 
     void measureBareWindow() {
@@ -206,8 +227,9 @@ class DesktopBench {
         const Process process({program_});
         main_ = desktop_.waitForWindow(mainCaption);
         std::this_thread::sleep_for(3s);
-        report("memory (Pss) at the main menu | bare window", process.proportionalSetSize() / 1024,
-               bareSize_ / 1024, "MiB", {.more = 8});
+        plainSize_ = process.proportionalSetSize();
+        report("memory (Pss) at the main menu | bare window", plainSize_ / 1024, bareSize_ / 1024, "MiB",
+               {.more = 8});
         report("shared libraries | bare window", static_cast<double>(process.sharedLibraries()),
                bareLibraries_, "", {.more = 3});
         reportIdle("main menu", process);
@@ -322,6 +344,7 @@ class DesktopBench {
     Desktop desktop_;
     Screen screen_;
     WindowOnScreen main_ = 0;
+    double plainSize_ = 0;  // kibibytes
     double bareSize_ = 0;
     double bareLibraries_ = 0;
     double bareClick_ = 0;  // milliseconds
@@ -334,9 +357,11 @@ class DesktopBench {
 int main(int argc, char** argv) {
     quabble::require(argc == 3, "usage: measure_desktop PROGRAM BARE_WINDOW");
     quabble::bench::DesktopBench bench(argv[1], argv[2]);
-    bench.measureStart();
+    bench.measureStart(quabble::Scale(), {.times = 1.2});
+    bench.measureStart(quabble::Scale::ofQuarters(8), {.times = 1.35});
     bench.measureBareWindow();
     bench.measureProgram();
+    bench.measureMemoryAt(quabble::Scale::ofQuarters(8));
     bench.measureTimedGame();
     bench.measureInstalledSize();
     return 0;

@@ -41,7 +41,7 @@ double microsecondsOf(const std::function<void()>& act, int turns) {
 }
 
 // Reports the medians of many short runs, the two of them in turns, with a rest before each.
-void compare(const char* what, const std::function<void()>& act, const std::function<void()>& limit,
+void compare(const std::string& what, const std::function<void()>& act, const std::function<void()>& limit,
              int turns, Goal goal, milliseconds rest = 0ms) {
     std::vector<double> measured;
     std::vector<double> limits;
@@ -54,25 +54,30 @@ void compare(const char* what, const std::function<void()>& act, const std::func
     report(what, median(measured), median(limits), "us", goal);
 }
 
-void measurePainters(const Surface& sheet) {
-    Canvas canvas(windowSize, Scale());
-    const Sprites sprites = spritesOf(sheet, Scale());
+void measureBoard(const Surface& sheet, Scale scale) {
+    Canvas canvas(windowSize, scale);
+    const Sprites sprites = spritesOf(sheet, scale);
     const CellBox board{232, 37, sheet_map::tileSize};
     PlayGrid grid;
     grid.recreate(maxGridCols, maxGridRows);
     SeededRandom random(1);
     fillBoard(grid, 1, {GameMode::Timed, 8, 4}, random);
-    const std::size_t bytes = std::size_t{192} * 28 * 28 * sizeof(std::uint32_t);
+    const auto edge = static_cast<std::size_t>(scale.edge(sheet_map::tileSize));
+    const std::size_t bytes = std::size_t{192} * edge * edge * sizeof(std::uint32_t);
     const std::vector<char> from(bytes, 'a');
     std::vector<char> to(bytes);
     compare(
-        "drawBoard of 192 cells | memcpy of its bytes", [&] { drawBoard(canvas, board, sprites, grid); },
+        "drawBoard of 192 cells" + atScale(scale) + " | memcpy of its bytes",
+        [&] { drawBoard(canvas, board, sprites, grid); },
         [&] {
             std::memcpy(to.data(), from.data(), bytes);
             asm volatile("" : : "r"(to.data()) : "memory");  // somebody may read it
         },
-        20, {.times = 1.5});
+        20, {.times = scale == Scale() ? 1.5 : 1.3});
+}
 
+void measureButton() {
+    Canvas canvas(windowSize, Scale());
     const ScreenButton box{.left = 225,
                            .top = 52,
                            .width = 225,
@@ -234,7 +239,7 @@ void measureRefresh(TickingWindow& window) {
     SDL_GetWindowSurface(native);
     compare(
         "whole refresh | SDL_UpdateWindowSurface", [&] { window.refresh(); },
-        [&] { SDL_UpdateWindowSurface(native); }, 5, {.times = 1.3},
+        [&] { SDL_UpdateWindowSurface(native); }, 5, {.times = 1.1},
         5ms);  // for the server to finish
 }
 
@@ -281,7 +286,10 @@ int main(int argc, char** argv) {
     const auto frontEnd = argc == 2 ? SdlFrontEnd::open(problem) : nullptr;
     if (!frontEnd)
         return EXIT_FAILURE;
-    bench::measurePainters(readPicture(std::string(argv[1]) + "/ALLPICDATA.BMP"));
+    const Surface sheet = readPicture(std::string(argv[1]) + "/ALLPICDATA.BMP");
+    for (const int scale : {1, 2, 3})
+        bench::measureBoard(sheet, Scale::ofQuarters(4 * scale));
+    bench::measureButton();
     bench::measureTraining();
     bench::measureHeap(argv[1]);
     constexpr milliseconds shortestTick{100};  // that of the last level

@@ -5,6 +5,8 @@
 #include <string>
 #include <vector>
 
+#include "draw/scale.hpp"
+
 namespace quabble::bench {
 
 // The most that may be measured: so many times the limit and so much more.
@@ -20,6 +22,10 @@ inline double quantile(std::vector<double> values, double part) {
 
 inline double median(std::vector<double> values) {
     return quantile(std::move(values), 0.5);
+}
+
+inline std::string atScale(Scale scale) {
+    return scale == Scale() ? "" : " at scale " + std::to_string(scale.quarters() / 4);
 }
 
 // Prints a line of the table whose head bench/run prints.

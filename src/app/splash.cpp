@@ -22,6 +22,7 @@ Splash::Splash(MessageLoop& loop, Pictures& pictures)
 void Splash::Form_Load() {
     setCaption(std::string(applicationTitle));
     setBorderless();
+    showPlainFirst();
     setClientSize(splashSize);
     tagline_ = {.left = 350,
                 .top = 400,
@@ -35,7 +36,7 @@ void Splash::Form_Load() {
 }
 
 void Splash::Form_Paint() {
-    canvas().copy(canvas().bounds(), pictures_.backdrop(canvas().scale()));
+    canvas().take(pictures_.backdrop(canvas().scale()));
     drawShadowText(canvas(), tagline_, 2, loadString(string_ids::tagline), defaultTextFormat);
 }
 

@@ -61,11 +61,11 @@ std::optional<Surface> decodeBitmap(std::span<const std::byte> file) {
     Surface picture(layout->width, layout->height);
     for (std::int32_t y = 0; y < layout->height; ++y) {
         const auto stored = static_cast<std::size_t>(layout->topDown ? y : layout->height - 1 - y);
-        auto line = file.subspan(layout->pixelsAt + stored * layout->stride);
+        const std::byte* from = file.data() + layout->pixelsAt + stored * layout->stride;
         for (std::uint32_t& pixel : picture.row(y)) {
-            pixel = pixelOf({std::to_integer<std::uint8_t>(line[2]), std::to_integer<std::uint8_t>(line[1]),
-                             std::to_integer<std::uint8_t>(line[0])});
-            line = line.subspan(3);
+            pixel = std::to_integer<std::uint32_t>(from[0]) | std::to_integer<std::uint32_t>(from[1]) << 8 |
+                    std::to_integer<std::uint32_t>(from[2]) << 16;
+            from += 3;
         }
     }
     return picture;

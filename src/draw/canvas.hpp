@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string_view>
+#include <utility>
 
 #include "draw/scale.hpp"
 #include "draw/surface.hpp"
@@ -21,6 +22,14 @@ class Canvas {
     const Surface& picture() const { return picture_; }  // in device pixels
 
     void fill(const Rect& area, Colour colour) { picture_.fill(scale_.device(area), colour); }
+
+    // Takes a picture over that was made for the scale and covers all of the canvas.
+    void take(Surface&& picture) {
+        if (picture.bounds() == picture_.bounds())
+            picture_ = std::move(picture);
+        else
+            copy(bounds(), picture);
+    }
 
     // Draws a frame along the area's edge: a line thick, and so many lines inside the edge, or outside of it.
     void outline(const Rect& area, Colour colour, std::int32_t linesInside = 0);

@@ -184,8 +184,9 @@ const Magnifier::Row& Magnifier::widened(const Surface& picture, std::int32_t y)
     row.pixels.clear();
     const auto from = picture.row(y);
     for (const Mix& mix : columns_) {
-        row.pixels.push_back(mixed(from[static_cast<std::size_t>(mix.first)],
-                                   from[static_cast<std::size_t>(mix.second)], mix.weight));
+        const std::uint32_t first = from[static_cast<std::size_t>(mix.first)];
+        row.pixels.push_back(
+            mix.weight == 0 ? first : mixed(first, from[static_cast<std::size_t>(mix.second)], mix.weight));
     }
     return row;
 }

@@ -50,7 +50,7 @@ void Window::show() {
     traits_.owner = owner_ == nullptr ? WindowId::none : owner_->id_;
     wantedScale_ = loop_.frontEnd().createWindow(id_, traits_);
     shown_ = true;
-    canvas_ = Canvas(traits_.clientSize, wantedScale_);
+    canvas_ = Canvas(traits_.clientSize, isPlainFirst_ ? Scale() : wantedScale_);
     Form_Paint();
     tellWhereTextIsTyped();
     refresh();

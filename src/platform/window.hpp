@@ -58,6 +58,9 @@ class Window {
     void setClientSize(Size size) { traits_.clientSize = size; }
     void setPosition(Point position) { traits_.position = position; }
     void setBorderless() { traits_.borderless = true; }
+    // The picture that it is first seen with is painted at scale 1, which is quicker, and another follows at
+    // once.
+    void showPlainFirst() { isPlainFirst_ = true; }
     void addControl(Control& control) { controls_.push_back(&control); }
     // The control that the keyboard goes to; null for the window itself.
     void setFocus(Control* control);
@@ -99,6 +102,7 @@ class Window {
     NativeWindow traits_;
     Canvas canvas_;
     Scale wantedScale_;
+    bool isPlainFirst_ = false;
     Canvas composed_;
     std::vector<Control*> controls_;
     Control* focus_ = nullptr;

@@ -45,13 +45,14 @@ struct Machine {
     AppState& app = program.state();
     GameState& game = app.game;
 
-    explicit Machine(std::uint64_t seed = 1) : Machine(MemoryBlob(), seed) {
+    explicit Machine(std::uint64_t seed = 1, Scale scale = {}) : Machine(MemoryBlob(), seed, scale) {
         for (std::int16_t table = 1; table <= highScoreTables; ++table)
             app.highScores.table(table).scores.fill(1'000'000'000);
     }
     // With the high scores that an earlier run has left.
-    explicit Machine(MemoryBlob ofEarlier, std::uint64_t seed = 1)
+    explicit Machine(MemoryBlob ofEarlier, std::uint64_t seed = 1, Scale scale = {})
         : kept(std::move(ofEarlier)), program(frontEnd, registry, seed) {
+        frontEnd.scale = scale;
         program.start();
         user.wait(std::chrono::minutes(1));  // until the main menu is there
     }

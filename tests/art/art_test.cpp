@@ -8,6 +8,8 @@
 #include "../support/files.hpp"
 #include "base/round_half_even.hpp"
 #include "colour_vision.hpp"
+#include "draw/fingerprint.hpp"
+#include "draw/png_file.hpp"
 #include "draw/scaling.hpp"
 
 namespace quabble {
@@ -206,6 +208,27 @@ TEST_F(Art, TheVeilIsAlikeAllOverAtEveryScale) {
 }
 
 // The strip of the waiting row hangs out of the window's blue, below the panel's last row of pixels.
+// The large version belongs to the sheet, and brought down to its size it is much the same picture.
+TEST_F(Art, IsTheSameInTheLargeVersion) {
+    const std::string file = bytesOf(QUABBLE_LARGE_SHEET);
+    const auto large = decodePng(std::as_bytes(std::span(file)));
+    ASSERT_TRUE(large);
+    const Surface small = reduced(*large, 4, Scale());
+    ASSERT_EQ(small.bounds(), sheet_.bounds());
+    double difference = 0;
+    for (std::int32_t i = 0; i < 400 * 838; ++i) {
+        const Colour one = small.at(i % 400, i / 400), other = sheet_.at(i % 400, i / 400);
+        difference += std::abs(one.red - other.red) + std::abs(one.green - other.green) +
+                      std::abs(one.blue - other.blue);
+    }
+    EXPECT_LT(difference / (3 * 400 * 838), 1.0);
+    std::uint64_t fingerprint = 0;
+    for (std::size_t i = 0; i < fingerprintSize; ++i)
+        fingerprint |= std::uint64_t{static_cast<unsigned char>(file[file.size() - fingerprintSize + i])}
+                       << (8 * i);
+    EXPECT_EQ(fingerprint, fingerprintOf(sheet_));
+}
+
 TEST_F(Art, ThePanelIsClosedAboveTheStrip) {
     const Colour windowBlue{62, 105, 214};
     for (std::int32_t x = 0; x < 400; ++x) {

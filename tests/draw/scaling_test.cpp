@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include "draw/canvas.hpp"
+
 namespace quabble {
 namespace {
 
@@ -21,6 +23,55 @@ TEST(Scale, FollowsTheDotsPerInchAsFarAsTheWindowFits) {
           Case{96, {0, 0}, 1}})
         EXPECT_EQ(scaleFor(c.dotsPerInch, mainWindow, c.available), c.expected) << c.dotsPerInch;
     EXPECT_EQ(scaled({675, 30}, 1.5), (Size{1012, 45}));
+}
+
+TEST(Scale, PutsEveryDevicePixelIntoTheProgramsPixelThatIsSeenThere) {
+    for (int quarters = 4; quarters <= 16; ++quarters) {
+        const Scale scale = Scale::ofQuarters(quarters);
+        for (std::int32_t device = -40; device < 3000; ++device) {
+            const std::int32_t pixel = scale.pixelAt({device, 0}).x;
+            EXPECT_LE(scale.edge(pixel), device) << quarters;
+            EXPECT_LT(device, scale.edge(pixel + 1)) << quarters;
+        }
+        EXPECT_EQ(scale.edge(232 + 28) - scale.edge(232), 7 * quarters) << "a tile";
+        EXPECT_EQ(scale.edge(37 + 28) - scale.edge(37), 7 * quarters) << "another one";
+        EXPECT_EQ(Scale::nearest(quarters / 4.0 + 0.1), scale);
+    }
+    EXPECT_EQ(Scale::ofQuarters(6).line(), 2);
+    EXPECT_EQ(Scale::ofQuarters(5).line(), 1);
+    EXPECT_EQ(Scale::nearest(0.5), Scale());
+    EXPECT_EQ(Scale::nearest(9), Scale::ofQuarters(16));
+}
+
+TEST(Canvas, DrawsFramesALineThickWithoutAGap) {
+    for (int quarters = 4; quarters <= 16; ++quarters) {
+        const Scale scale = Scale::ofQuarters(quarters);
+        Canvas canvas({40, 30}, scale);
+        const Rect area{7, 5, 31, 22};
+        for (const std::int32_t inside : {-2, -1, 0, 1})
+            canvas.outline(area, {255, 255, 255}, inside);
+        const Rect outer = scale.device(area).shrunkBy(-2 * scale.line());
+        const Rect inner = outer.shrunkBy(4 * scale.line());
+        for (std::int32_t y = 0; y < canvas.picture().height(); ++y) {
+            for (std::int32_t x = 0; x < canvas.picture().width(); ++x) {
+                EXPECT_EQ(canvas.picture().at(x, y).red == 255, outer.contains(x, y) && !inner.contains(x, y))
+                    << quarters << ": " << x << "," << y;
+            }
+        }
+    }
+}
+
+TEST(Reduced, IsTheMeanOfWhatAPixelCovers) {
+    Surface drawing(8, 4);  // of 2 x 1 pixels: the left one is dark, the right one bright
+    drawing.fill({4, 0, 8, 4}, {200, 100, 40});
+    const Surface plain = reduced(drawing, 4, Scale());
+    EXPECT_EQ(plain.at(0, 0), (Colour{0, 0, 0}));
+    EXPECT_EQ(plain.at(1, 0), (Colour{200, 100, 40}));
+    const Surface half = reduced(drawing, 4, Scale::ofQuarters(6));
+    ASSERT_EQ(half.bounds(), (Rect{0, 0, 3, 2}));
+    EXPECT_EQ(half.at(0, 0), (Colour{0, 0, 0}));
+    EXPECT_EQ(half.at(1, 0), (Colour{100, 50, 20})) << "half of each";
+    EXPECT_EQ(half.at(2, 1), (Colour{200, 100, 40})) << "what is beyond the edge does not count";
 }
 
 TEST(Magnifier, RepeatsPixelsAtWholeScalesAndMixesNeighboursAtOthers) {

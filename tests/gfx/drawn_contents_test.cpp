@@ -90,6 +90,56 @@ TEST_F(Painters, HaveAStandInForASheetThatCannotBeUsed) {
     }
 }
 
+// Every part of this sheet has a colour of its own.
+Surface flatSheet(std::int32_t factor) {
+    Surface sheet(400 * factor, 838 * factor);
+    const auto fill = [&](const Rect& part, Colour colour) {
+        sheet.fill({part.left * factor, part.top * factor, part.right * factor, part.bottom * factor},
+                   colour);
+    };
+    for (std::int32_t tile = 0; tile < 14; ++tile)
+        fill(sheet_map::tile(tile), {static_cast<std::uint8_t>(10 * tile + 5), 200, 99});
+    fill(sheet_map::veil, {0x0F, 0xF0, 0x3C});
+    fill(sheet_map::emptyGauge, {1, 2, 3});
+    fill(sheet_map::playPanel, {90, 10, 130});
+    return sheet;
+}
+
+TEST(Sprites, TakeNoColourFromTheirNeighboursOnTheSheet) {
+    const auto isFlat = [](const Surface& sprite, Colour colour) {
+        Surface expected(sprite.width(), sprite.height());
+        expected.fill(expected.bounds(), colour);
+        return sprite == expected;
+    };
+    for (int quarters = 4; quarters <= 16; ++quarters) {
+        const Scale scale = Scale::ofQuarters(quarters);
+        for (const Sprites& sprites : {spritesOf(flatSheet(1), scale), spritesOf(flatSheet(4), 4, scale)}) {
+            for (std::size_t i = 0; i < 14; ++i) {
+                const auto red = static_cast<std::uint8_t>(10 * i + 5);
+                EXPECT_EQ(sprites.tiles[i].bounds(), (Rect{0, 0, 7 * quarters, 7 * quarters}));
+                EXPECT_TRUE(isFlat(sprites.tiles[i], {red, 200, 99})) << i << " at " << quarters;
+                const auto veiledRed = static_cast<std::uint8_t>(red & 0x0F);
+                EXPECT_TRUE(isFlat(sprites.veiledTiles[i], {veiledRed, 200 & 0xF0, 99 & 0x3C})) << i;
+            }
+            EXPECT_TRUE(isFlat(sprites.emptyGauge, {1, 2, 3})) << quarters;
+            EXPECT_TRUE(isFlat(sprites.playPanel, {90, 10, 130})) << quarters;
+        }
+    }
+}
+
+TEST(Sprites, AreThoseOfThePictureThatIsThere) {
+    Surface own = flatSheet(1);
+    own.fill({0, 0, 28, 28}, {250, 250, 250});
+    const Scale scale = Scale::ofQuarters(6);
+    // A large version that belongs to another sheet.
+    HeadlessFrontEnd frontEnd(
+        {{"ALLPICDATA.BMP", bitmapOf(own)}, {"ALLPICDATA.PNG", bitmapOf(flatSheet(1))}});
+    Pictures pictures(frontEnd);
+    EXPECT_TRUE(pictures.sprites(scale).tiles[0] == spritesOf(own, scale).tiles[0]);
+    EXPECT_TRUE(pictures.sprites(Scale()).tiles[0] == spritesOf(own, Scale()).tiles[0])
+        << "the scale changed";
+}
+
 TEST(Texts, KeysAreReplacedPairByPair) {
     EXPECT_EQ(fillText("|1-|1|", {"|1", 7}), "7-7|");
     EXPECT_EQ(fillText("|1 |2", {"|1", "|2", "|2", 5}), "5 5");

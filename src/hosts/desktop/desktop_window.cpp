@@ -38,12 +38,12 @@ DesktopWindow::DesktopWindow(const NativeWindow& traits, const DesktopWindow* ow
         return;
     setFactor(wantedFactor());
     const Size size = sizeAtScale();
-    SDL_SetWindowSize(sdl(), size.width, size.height);
+    if (size != traits.clientSize)
+        SDL_SetWindowSize(sdl(), size.width, size.height);
     moveTo(wantedPosition());
     if (isDialog)
         SDL_SetWindowModalFor(sdl(), owner->sdl());
     if (const auto x11 = X11Window::of(sdl())) {
-        x11->setIcons(applicationIcons());
         refuseDrops(*x11);
         if (isDialog) {
             x11->haveOnlyCloseButton();
@@ -152,6 +152,8 @@ void DesktopWindow::show(const Surface& picture) {
         if (!shared_)
             SDL_GetWindowSurface(sdl());  // for which SDL makes a Wayland window anew; that is not to be seen
         SDL_ShowWindow(sdl());
+        if (const auto x11 = X11Window::of(sdl()))
+            x11->setIcons(applicationIcons());  // which take a while
     }
     if (shared_)
         return;

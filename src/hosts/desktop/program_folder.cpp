@@ -1,12 +1,15 @@
 #include "hosts/desktop/program_folder.hpp"
 
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
 #include <filesystem>
-#include <fstream>
 
 namespace quabble {
 namespace {
 
-constexpr std::uintmax_t largestFile = 64 << 20;  // bytes
+constexpr off_t largestFile = 64 << 20;  // bytes
 
 std::filesystem::path pathOf(std::string_view name) {
     return std::filesystem::path(programFolder()) / name;
@@ -20,17 +23,16 @@ std::string programFolder() {
 }
 
 std::vector<std::byte> readProgramFile(std::string_view name) {
-    const std::filesystem::path path = pathOf(name);
-    std::error_code unknown;
-    if (!std::filesystem::is_regular_file(path, unknown))  // a pipe would be waited for
-        return {};
-    const std::uintmax_t size = std::filesystem::file_size(path, unknown);
-    if (unknown || size > largestFile)
-        return {};
-    std::vector<std::byte> bytes(size);
-    std::ifstream stream(path, std::ios::binary);
-    if (!stream.read(reinterpret_cast<char*>(bytes.data()), static_cast<std::streamsize>(size)))
-        return {};
+    std::vector<std::byte> bytes;
+    const int file =
+        ::open(pathOf(name).c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);  // a pipe is not waited for
+    struct stat status{};
+    if (::fstat(file, &status) == 0 && S_ISREG(status.st_mode) && status.st_size <= largestFile) {
+        bytes.resize(static_cast<std::size_t>(status.st_size));
+        if (::read(file, bytes.data(), bytes.size()) != status.st_size)
+            bytes.clear();
+    }
+    ::close(file);
     return bytes;
 }
 

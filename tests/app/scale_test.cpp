@@ -1,0 +1,140 @@
+#include <gtest/gtest.h>
+
+#include <functional>
+
+#include "golden.hpp"
+#include "machine.hpp"
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr Scale scales[] = {Scale::ofQuarters(5), Scale::ofQuarters(6), Scale::ofQuarters(7),
+                            Scale::ofQuarters(8), Scale::ofQuarters(12)};
+
+std::string nameOf(Scale scale) {
+    return std::to_string(scale.quarters() * 25);
+}
+
+// Every screen there is, each a story of its own.
+struct Screen {
+    const char* name;
+    bool isKept;  // as golden pictures
+    std::function<void(Machine&)> show;
+};
+const Screen screens[] = {
+    {"menu", true, [](Machine& machine) { machine.pointAtMenu(3); }},
+    {"training", false,
+     [](Machine& machine) { machine.start(1, "..12/.112.31.3/12112311333"), machine.clickCell(3, 16); }},
+    {"timed", true,
+     [](Machine& machine) {
+         machine.clickMenu(2);
+         machine.user.wait(5250ms);
+         machine.user.movePointer(95, 425);
+     }},
+    {"strategy", false, [](Machine& machine) { machine.start(3, "....2/...31Sa14"); }},
+    {"paused", false, [](Machine& machine) { machine.clickMenu(3), machine.clickPanel(8); }},
+    {"result", false, [](Machine& machine) { machine.clickMenu(1), machine.clickPanel(8); }},
+    {"name", true,
+     [](Machine& machine) {
+         machine.app.highScores.table(1) = {};
+         machine.start(1, "....11");
+         machine.clickCell(5, 16);
+         machine.user.wait(1s);
+         machine.closeDialog();
+         machine.user.type("Zo\u00EB");
+         machine.user.edit(EditCommand::Left, true);
+     }},
+    {"scores", false, [](Machine& machine) { machine.clickMenu(6), machine.user.movePointer(300, 420); }}};
+
+// How far the colours of a picture at a scale are from those at scale 1, in the mean over all of the
+// program's pixels: 0 to 255.
+double meanDifference(const Surface& scaled, Scale scale, const Surface& plain) {
+    double sum = 0;
+    for (std::int32_t i = 0; i < plain.width() * plain.height(); ++i) {
+        const std::int32_t x = i % plain.width(), y = i / plain.width();
+        const Rect part = scale.device(Rect::ofSize(x, y, 1, 1));
+        double red = 0, green = 0, blue = 0;
+        for (std::int32_t j = 0; j < part.width() * part.height(); ++j) {
+            const Colour colour = scaled.at(part.left + j % part.width(), part.top + j / part.width());
+            red += colour.red, green += colour.green, blue += colour.blue;
+        }
+        const double count = part.width() * part.height();
+        const Colour expected = plain.at(x, y);
+        sum += std::abs(red / count - expected.red) + std::abs(green / count - expected.green) +
+               std::abs(blue / count - expected.blue);
+    }
+    return sum / (3.0 * plain.width() * plain.height());
+}
+
+// Letters and lines have finer edges there, and lie up to half a pixel aside.
+TEST(Scales, ShowEveryScreenAsItIsAtScaleOne) {
+    for (const auto& [name, isKept, show] : screens) {
+        Machine plain;
+        show(plain);
+        for (const Scale scale : scales) {
+            Machine machine(1, scale);
+            show(machine);
+            const Surface& seen = machine.user.top().picture;
+            ASSERT_EQ(seen.bounds(), scale.device(plain.user.top().picture.bounds())) << name;
+            EXPECT_LT(meanDifference(seen, scale, plain.user.top().picture), 2.5) << name << nameOf(scale);
+            if (isKept && scale != Scale::ofQuarters(7))
+                expectGolden(seen, std::string(name) + "_" + nameOf(scale) + ".png");
+        }
+    }
+}
+
+// The first machine has its scale from the beginning, the other one gets it on the way: then they look alike.
+TEST(Scales, MayChangeAtAnyMoment) {
+    const std::pair<const char*, std::function<void(Machine&, const std::function<void()>&)>> stories[] = {
+        {"in a move",
+         [](Machine& machine, const auto& change) {
+             machine.start(1, ".....2.4/.....1.4/...31134");
+             machine.clickCell(5, 16);
+             machine.user.wait(100ms);
+             change();
+             machine.user.wait(100ms);
+             machine.clickPanel(6);
+             machine.user.wait(1s);
+         }},
+        {"in a dialog",
+         [](Machine& machine, const auto& change) {
+             machine.clickMenu(2);
+             machine.user.wait(3500ms);
+             machine.clickPanel(10);
+             change();
+             machine.user.wait(1s);
+         }},
+        {"behind the pause notice",
+         [](Machine& machine, const auto& change) {
+             machine.clickMenu(2);
+             machine.user.wait(1s);
+             machine.clickPanel(8);
+             change();
+             machine.user.wait(1s);
+             machine.user.click(10, 10);
+             machine.user.wait(1s);
+         }},
+        {"while minimised", [](Machine& machine, const auto& change) {
+             machine.clickMenu(3);
+             machine.user.press('q');
+             change();
+             machine.user.restore();
+             machine.user.click(10, 10);
+             machine.clickStrip();
+         }}};
+    for (const auto& [name, play] : stories) {
+        Machine there(1, Scale::ofQuarters(6));
+        play(there, [] {});
+        Machine changed;
+        play(changed, [&] { changed.frontEnd.rescale(Scale::ofQuarters(6)), changed.program.wake(); });
+        EXPECT_EQ(changed.game.stats.score, there.game.stats.score) << name;
+        ASSERT_EQ(changed.frontEnd.windows().size(), there.frontEnd.windows().size()) << name;
+        for (const auto& [window, shown] : there.frontEnd.windows())
+            EXPECT_TRUE(changed.frontEnd.windows().at(window).picture == shown.picture) << name;
+    }
+}
+
+}  // namespace
+}  // namespace quabble
