@@ -33,13 +33,15 @@ bool writePicture(const std::string& file, const Surface& picture) {
                           picture.width() * 3) != 0;
 }
 
+constexpr Scale scale = Scale::ofQuarters(8);
+
 // A player who always takes the largest cluster, and someone with a camera.
 class Photographer {
  public:
     Photographer(const std::string& programFolder, std::string pictureFolder, std::uint64_t seed)
         : pictureFolder_(std::move(pictureFolder)),
-          frontEnd_(picturesIn(programFolder)),
-          program_(frontEnd_, registry_, seed) {
+          frontEnd_(picturesIn(programFolder)), program_(frontEnd_, registry_, seed) {
+        frontEnd_.scale = scale;
         program_.start();
         user_.wait(3s);  // the splash has gone
     }
@@ -116,8 +118,9 @@ class Photographer {
 
     // The lower part of the arcade board, and the waiting row.
     Surface boardPicture() const {
-        Surface picture(400, 375);
-        picture.copy(picture.bounds(), user_.top().picture, {200, 165});
+        const Rect part = scale.device(Rect::ofSize(200, 165, 400, 375));
+        Surface picture(part.width(), part.height());
+        picture.copy(picture.bounds(), user_.top().picture, {part.left, part.top});
         return picture;
     }
 
