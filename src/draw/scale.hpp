@@ -20,7 +20,7 @@ class Scale {
 
     // The quarter that is nearest to the factor.
     static constexpr Scale nearest(double factor) {
-        return ofQuarters(static_cast<std::int32_t>(std::clamp(factor, 1.0, 4.0) * 4 + 0.5));
+        return ofQuarters((static_cast<std::int32_t>(std::clamp(factor, 1.0, 4.0) * 8) + 1) / 2);
     }
 
     constexpr std::int32_t quarters() const { return quarters_; }

@@ -1,8 +1,10 @@
 #include "draw/scaling.hpp"
 
 #include <algorithm>
+#include <cassert>
 #include <cmath>
 #include <cstring>
+#include <utility>
 
 #include "base/round_half_even.hpp"
 
@@ -49,13 +51,14 @@ std::vector<std::vector<Share>> sharesOf(std::int32_t largePixels, std::int32_t 
     const std::int32_t end = largePixels * large;
     std::vector<std::vector<Share>> shares;
     for (std::int32_t begin = 0; begin < end; begin += device) {
-        std::vector<Share>& under = shares.emplace_back();
+        std::vector<Share> under;
         const std::int32_t last = std::min(begin + device, end);
         for (std::int32_t at = begin; at < last;) {
             const std::int32_t next = std::min((at / large + 1) * large, last);
             under.push_back({at / large, static_cast<std::uint32_t>(next - at)});
             at = next;
         }
+        shares.push_back(std::move(under));
     }
     return shares;
 }
@@ -72,6 +75,7 @@ struct Sum {
         count += times;
     }
     std::uint32_t mean() const {
+        assert(count > 0);
         const auto part = [this](std::uint32_t sum) {
             return static_cast<std::uint8_t>((sum + count / 2) / count);
         };
@@ -181,12 +185,13 @@ const Magnifier::Row& Magnifier::widened(const Surface& picture, std::int32_t y)
     if (row.of == y)
         return row;
     row.of = y;
-    row.pixels.clear();
+    row.pixels.resize(columns_.size());
     const auto from = picture.row(y);
-    for (const Mix& mix : columns_) {
+    for (std::size_t x = 0; x < columns_.size(); ++x) {
+        const Mix& mix = columns_[x];
         const std::uint32_t first = from[static_cast<std::size_t>(mix.first)];
-        row.pixels.push_back(
-            mix.weight == 0 ? first : mixed(first, from[static_cast<std::size_t>(mix.second)], mix.weight));
+        row.pixels[x] =
+            mix.weight == 0 ? first : mixed(first, from[static_cast<std::size_t>(mix.second)], mix.weight);
     }
     return row;
 }

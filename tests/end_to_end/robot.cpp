@@ -186,7 +186,7 @@ int main(int argc, char** argv) {
         robot.setScale(quabble::Scale::ofQuarters(quarters));
         robot.forgetScores(quarters);
         robot.startProgram();
-        robot.play(quabble::GameMode::Training, quarters == 6 ? 5 : 1000);
+        robot.play(quabble::GameMode::Training, quarters == 6 ? 4 : 8);
         robot.closeAndCheckExit();
     }
     return 0;

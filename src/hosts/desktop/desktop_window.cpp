@@ -81,7 +81,7 @@ double DesktopWindow::wantedFactor() const {
 }
 
 // Before the window is shown SDL would wait ten milliseconds for the answer that it has moved.
-void DesktopWindow::moveTo(Point corner) {
+void DesktopWindow::moveTo(Point corner) const {
     const auto x11 = X11Window::of(sdl());
     if (x11 && !isOpened_)
         x11->moveTo(corner);
@@ -152,8 +152,10 @@ void DesktopWindow::show(const Surface& picture) {
         if (!shared_)
             SDL_GetWindowSurface(sdl());  // for which SDL makes a Wayland window anew; that is not to be seen
         SDL_ShowWindow(sdl());
-        if (const auto x11 = X11Window::of(sdl()))
-            x11->setIcons(applicationIcons());  // which take a while
+        if (const auto x11 = X11Window::of(sdl())) {  // what takes a while and need not be there before
+            x11->setIcons(applicationIcons());
+            x11->listenToResources();
+        }
     }
     if (shared_)
         return;

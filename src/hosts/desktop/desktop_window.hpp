@@ -52,7 +52,7 @@ class DesktopWindow {
     Size size() const;  // in the desktop's coordinates
     double wantedFactor() const;
     void setFactor(double factor);
-    void moveTo(Point corner);
+    void moveTo(Point corner) const;
     Size sizeAtScale() const;
     Point wantedPosition() const;
     Magnifier& magnifierFor(const Surface& picture, Size shown);

@@ -26,6 +26,8 @@ std::vector<std::byte> readProgramFile(std::string_view name) {
     std::vector<std::byte> bytes;
     const int file =
         ::open(pathOf(name).c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);  // a pipe is not waited for
+    if (file < 0)
+        return bytes;
     struct stat status{};
     if (::fstat(file, &status) == 0 && S_ISREG(status.st_mode) && status.st_size <= largestFile) {
         bytes.resize(static_cast<std::size_t>(status.st_size));

@@ -205,8 +205,6 @@ Scale SdlFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
         unopened_.push_back(window);
         return {};
     }
-    if (const auto x11 = X11Window::of(made->sdl()); x11 && windows_.empty())
-        x11->listenToResources();
     const Scale scale = made->scale();
     windows_[window] = std::move(made);
     return scale;
