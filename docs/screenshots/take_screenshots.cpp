@@ -40,7 +40,8 @@ class Photographer {
  public:
     Photographer(const std::string& programFolder, std::string pictureFolder, std::uint64_t seed)
         : pictureFolder_(std::move(pictureFolder)),
-          frontEnd_(picturesIn(programFolder)), program_(frontEnd_, registry_, seed) {
+          frontEnd_(picturesIn(programFolder)),
+          program_(frontEnd_, registry_, seed) {
         frontEnd_.scale = scale;
         program_.start();
         user_.wait(3s);  // the splash has gone
