@@ -8,24 +8,10 @@
 #include <string>
 
 #include "../support/files.hpp"
+#include "../support/kept.hpp"
 #include "hosts/desktop/registry/sqlite_registry.hpp"
-#include "store/settings_store.hpp"
 
 namespace quabble {
-
-// What a run of the program has in memory of what is kept.
-struct Kept {
-    Settings settings;
-    HighScores highScores;
-
-    StoreResult load(RegistryStore& registry) {
-        return SettingsStore(registry).loadSettings(settings, highScores);
-    }
-    StoreResult save(RegistryStore& registry) {
-        return SettingsStore(registry).saveSettings(settings, highScores);
-    }
-    HighScoreTable& table(std::int16_t number) { return highScores.table(number); }
-};
 
 // A folder of its own for each test, and a look into the file that is independent of the registry.
 class SqliteFixture : public ::testing::Test {

@@ -1,24 +1,10 @@
 #include <gtest/gtest.h>
 
+#include "../support/kept.hpp"
 #include "hosts/headless/memory_blob.hpp"
-#include "store/settings_store.hpp"
 
 namespace quabble {
 namespace {
-
-// What a run of the program has in memory of what is kept.
-struct Kept {
-    Settings settings;
-    HighScores highScores;
-
-    StoreResult load(RegistryStore& registry) {
-        return SettingsStore(registry).loadSettings(settings, highScores);
-    }
-    StoreResult save(RegistryStore& registry) {
-        return SettingsStore(registry).saveSettings(settings, highScores);
-    }
-    HighScoreTable& table(std::int16_t number) { return highScores.table(number); }
-};
 
 class SettingsTest : public testing::Test {
  protected:
