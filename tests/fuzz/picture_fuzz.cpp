@@ -1,14 +1,18 @@
-// Feeds any bytes to the picture loader.
+// Feeds any bytes to the picture loaders.
 
 #include <cassert>
 #include <span>
 
 #include "draw/bitmap_file.hpp"
+#include "draw/png_file.hpp"
 
 extern "C" int LLVMFuzzerTestOneInput(const unsigned char* data, std::size_t size) {
-    const auto picture = quabble::decodeBitmap(std::as_bytes(std::span(data, size)));
+    const auto bytes = std::as_bytes(std::span(data, size));
+    const auto picture = quabble::decodeBitmap(bytes);
     // A picture never has more pixels than the file has bytes for.
     assert(!picture ||
            static_cast<std::size_t>(picture->width()) * static_cast<std::size_t>(picture->height()) < size);
+    const auto compressed = quabble::decodePng(bytes);
+    assert(!compressed || (compressed->width() <= 4096 && compressed->height() <= 4096));
     return 0;
 }
