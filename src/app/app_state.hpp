@@ -11,8 +11,6 @@
 
 namespace quabble {
 
-constexpr std::int16_t layoutUnit = 45;  // pixels; the windows' layouts are multiples of it
-
 // What lives as long as the program and is no window: the game, the tables, the settings, the pictures.
 class AppState {
  public:

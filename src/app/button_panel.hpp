@@ -3,6 +3,8 @@
 #include <cstddef>
 #include <cstdint>
 #include <optional>
+#include <string_view>
+#include <utility>
 #include <vector>
 
 #include "draw/canvas.hpp"

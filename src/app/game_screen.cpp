@@ -20,9 +20,9 @@ GameScreen::GameScreen(MessageLoop& loop, Window& window, AppState& app, Handler
       app_(app),
       handlers_(std::move(handlers)),
       timerBlocks_(loop, handlers_.blockTimerTick),
-      diagWow_(loop, window, app.game, layoutUnit),
+      diagWow_(loop, window, app.game, layout::layoutUnit),
       diagUN_(loop, window),
-      frmStats_(loop, window, app.highScores, layoutUnit),
+      frmStats_(loop, window, app.highScores, layout::layoutUnit),
       standardBtns_(layout::initStandardBtns(), string_ids::classicPanelBase, buttonShadow),
       arcadeBtns_(layout::initArcadeBtns(), string_ids::arcadePanelBase, buttonShadow) {}
 

@@ -1,6 +1,5 @@
 #include "app/layout.hpp"
 
-#include "app/app_state.hpp"
 #include "base/round_half_even.hpp"
 
 namespace quabble::layout {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstdint>
 #include <vector>
 
 #include "draw/geometry.hpp"
@@ -7,6 +8,8 @@
 
 // Where everything lies in the main window.
 namespace quabble::layout {
+
+constexpr std::int16_t layoutUnit = 45;  // pixels; the windows' layouts are multiples of it
 
 constexpr Font captionFont{Typeface::SansBold, 14};  // of buttons, labels and values
 

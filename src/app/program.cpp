@@ -29,7 +29,7 @@ std::optional<WindowId> Program::modalWindow() const {
     return window == nullptr ? std::nullopt : std::optional(window->id());
 }
 
-// Before the main window is there nothing has changed.
+// Before the main window is there nothing has changed, and when it closed everything was saved.
 bool Program::keep() {
     return !frmQuabble_ || !frmQuabble_->isShown() || state_.save() == StoreResult::Done;
 }

@@ -14,7 +14,7 @@ namespace quabble {
 
 // The program from its start to its end: what a host drives. The host makes one, starts it, and then, until
 // it has ended, posts what happens, and wakes it after that and at the next deadline. All on one thread.
-// Whatever state the program is in, it may be destroyed; its windows close.
+// It may be destroyed in any state, but not from inside its own calls; its windows close.
 class Program {
  public:
     // The front end and the registry must outlive the program. The seed decides every board.
@@ -28,7 +28,7 @@ class Program {
     void post(const InputEvent& event) { loop_.post(event); }
 
     // The program goes on until it has to wait again. Without an event and before the next deadline it does
-    // nothing. Not to be called from inside a call of the front end.
+    // nothing, and neither does it inside a call of the front end.
     void wake() { loop_.wake(); }
 
     // When to wake it at the latest, if nothing happens before; it may lie in the past. Nothing when it waits

@@ -28,7 +28,7 @@ struct NativeWindow {
     // if it has none, on the screen.
     std::optional<Point> position;
     bool borderless = false;
-    WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner, which is on the screen
+    WindowId owner = WindowId::none;  // set for a dialog: it stays above its owner
 };
 
 enum class PointerShape { Arrow, Hand };
@@ -36,9 +36,10 @@ enum class PointerShape { Arrow, Hand };
 // The machine that the program runs on, seen from the program: what a host has to write. Sizes and places are
 // in the program's pixels, of which each may be several of the screen's. Texts are UTF-8.
 //
-// The program calls it from inside `start`, `wake` and `requestEnd` of `Program`, and when it is destroyed;
-// all on one thread. An operation may post events, but must not wake the program, and must come back at once:
-// what takes time is reported by an event. Nothing is thrown. Operations with a body here may be left out.
+// The program calls it from inside `start` and `wake` of `Program`, and when it is destroyed; the time it
+// asks for in `nextDeadline`, too. All on one thread. An operation may post events, and must come back at
+// once: what takes time is reported by an event. Nothing is thrown. Operations with a body here may be left
+// out.
 class FrontEnd {
  public:
     virtual ~FrontEnd() = default;
@@ -51,11 +52,13 @@ class FrontEnd {
     // for the id asks to close it, as if the user had. When another scale is wanted later an event says so.
     virtual Scale createWindow(WindowId window, const NativeWindow& traits) = 0;
 
-    // The operations below that name a window are called for those that were created and not closed yet.
+    // The operations below that name a window are called for those that were created and not closed yet, also
+    // for one that could not be made.
 
     // Shows the picture, of the window's client size at a scale that was wanted for it, if not always the
-    // latest. When the window is uncovered or restored the front end shows it again by itself: it stays where
-    // it is until the next one is shown or the window is closed.
+    // latest. When the window is uncovered or restored the front end shows it again by itself: from a copy,
+    // or with what it has kept of it, for the program draws on in the same place before it shows it again.
+    // The place stays until the next picture is shown or the window is closed.
     virtual void showPixels(WindowId window, const Surface& picture) = 0;
     // The window goes from the screen, its owner is to take input again, and events that are still on their
     // way to it may be posted or not.

@@ -65,7 +65,8 @@ void MessageLoop::post(const InputEvent& event) {
 }
 
 void MessageLoop::wake() {
-    assert(!isAwake_);
+    if (isAwake_)
+        return;  // what was posted is taken by the wake that is under way
     isAwake_ = true;
     while (program_ && isOver(programWaitsUntil_))
         std::exchange(program_, {}).resume();

@@ -39,7 +39,7 @@ class MessageLoop {
     Task<> runPendingMessages();
 
     // Shows the window and delivers messages until it closes; no other window takes input meanwhile. The
-    // window that took input before must be its owner, if there was such a one.
+    // window that took all input before, if one did, must be its owner.
     Task<> showModal(Window& window);
 
     // Delivers messages until the program ends; it never comes back.
@@ -53,8 +53,8 @@ class MessageLoop {
     // Something happened. It is delivered when the program next asks for messages.
     void post(const InputEvent& event);
 
-    // Lets the program go on as far as it can: until it waits for something that has not happened yet. Not to
-    // be called from inside the program.
+    // Lets the program go on as far as it can: until it waits for something that has not happened yet. From
+    // inside the program it does nothing.
     void wake();
 
     // When to wake the program at the latest, if no event comes before.

@@ -24,8 +24,8 @@ class Window {
     // a window's outer size count with it.
     static constexpr Size nominalFrame{6, 29};
 
-    // A window with an owner is a dialog. The loop and the owner must outlive it, and it must outlive what
-    // its handlers wait for.
+    // A window with an owner is a dialog. The loop and the owner must outlive it. It must not be destroyed
+    // while one of its handlers runs or waits.
     explicit Window(MessageLoop& loop, Window* owner = nullptr);
     virtual ~Window();
     Window(const Window&) = delete;

@@ -15,8 +15,9 @@ class Blob {
     virtual bool write(std::span<const std::byte> bytes) = 0;
 };
 
-// A registry that is read and written as one blob. Of two that change it at the same time the first one to
-// commit wins.
+// A registry that is read and written as one blob. Of two transactions that change it at the same time the
+// first one to commit wins; between two programs the blob must not change between a read and the write that
+// follows at once. That it cannot be written shows when a transaction is committed.
 class BlobRegistryStore final : public RegistryStore {
  public:
     // The blob must outlive the store.

@@ -52,8 +52,8 @@ class RegistryStore {
  public:
     virtual ~RegistryStore() = default;
 
-    // Nothing when the registry cannot be read and, to write, changed. It comes back within a second or so,
-    // also when another program is writing.
+    // Nothing when the registry cannot be read or, for a transaction that writes, it is known that it cannot
+    // be changed. It comes back within a second or so, also when another program is writing.
     virtual std::unique_ptr<RegistryTransaction> begin(Access access) = 0;
 };
 

@@ -119,15 +119,10 @@ void SolvingData::setSplashSeen() {
     writeNumber(std::span<std::byte>(bytes), 2, std::int16_t{1});
 }
 
-std::unique_ptr<RegistryTransaction> SettingsStore::begin(Access access) {
-    auto transaction = isGivenUp_ ? nullptr : registry_.begin(access);
-    isGivenUp_ = transaction == nullptr;
-    return transaction;
-}
-
 StoreResult SettingsStore::loadSettings(Settings& settings, HighScores& highScores) {
-    const auto registry = begin(Access::Read);
-    if (!registry)
+    const auto registry = registry_.begin(Access::Read);
+    isGivenUp_ = registry == nullptr;
+    if (isGivenUp_)
         return StoreResult::NotOpened;
     query(*registry, "SOLVINGDATA", settings.solvingData.bytes);
     query(*registry, "NUMWFSF", settings.numwfsf);
@@ -139,7 +134,7 @@ StoreResult SettingsStore::loadSettings(Settings& settings, HighScores& highScor
 }
 
 StoreResult SettingsStore::saveSettings(const Settings& settings, const HighScores& highScores) {
-    const auto registry = begin(Access::Write);
+    const auto registry = isGivenUp_ ? nullptr : registry_.begin(Access::Write);
     if (!registry)
         return StoreResult::NotOpened;
     registry->createKey(ownKey(), "USERDATA");

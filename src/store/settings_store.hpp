@@ -3,7 +3,6 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
-#include <memory>
 
 #include "engine/high_scores.hpp"
 #include "registry/registry_store.hpp"
@@ -35,8 +34,8 @@ constexpr const char* unknownName = "Anononymous";
 // What became of the settings. The user is told of a registry that could not be opened, and of nothing else.
 enum class StoreResult { Done, NotOpened, NotWritten };
 
-// The settings and the tables as they are kept between runs. Once the registry could not be opened it is left
-// alone, so that values that were never read are not overwritten.
+// The settings and the tables as they are kept between runs. When they could not be loaded the registry is
+// left alone from then on, so that values that were never read are not overwritten.
 class SettingsStore {
  public:
     // The registry must outlive the store.
@@ -51,8 +50,6 @@ class SettingsStore {
     StoreResult saveSettings(const Settings& settings, const HighScores& highScores);
 
  private:
-    std::unique_ptr<RegistryTransaction> begin(Access access);
-
     RegistryStore& registry_;
     bool isGivenUp_ = false;
 };

@@ -122,7 +122,7 @@ TEST_F(SettingsTest, AMissingNameCostsItsScore) {
 }
 
 // Values that were never read are not overwritten.
-TEST_F(SettingsTest, ARegistryThatCouldNotBeOpenedIsLeftAlone) {
+TEST_F(SettingsTest, ARegistryThatCouldNotBeReadIsLeftAlone) {
     Kept first;
     first.table(1).names[0] = "first";
     first.save(registry);
@@ -136,6 +136,17 @@ TEST_F(SettingsTest, ARegistryThatCouldNotBeOpenedIsLeftAlone) {
     blob.bytes = sound;
     EXPECT_EQ(store.saveSettings(kept.settings, kept.highScores), StoreResult::NotOpened);
     EXPECT_EQ(blob.bytes, sound);
+}
+
+// A page that is hidden is saved many times.
+TEST_F(SettingsTest, ASaveThatFailsIsNotTheLast) {
+    Kept kept;
+    SettingsStore store(registry);
+    EXPECT_EQ(store.loadSettings(kept.settings, kept.highScores), StoreResult::Done);
+    blob.bytes.resize(50);
+    EXPECT_EQ(store.saveSettings(kept.settings, kept.highScores), StoreResult::NotOpened);
+    blob.bytes.clear();
+    EXPECT_EQ(store.saveSettings(kept.settings, kept.highScores), StoreResult::Done);
 }
 
 }  // namespace

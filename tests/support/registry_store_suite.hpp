@@ -61,6 +61,12 @@ TYPED_TEST_P(RegistryStoreSuite, KeepsValuesUnderNamesWithoutRegardToCase) {
     EXPECT_EQ(this->kept("empty"), "3:");
     EXPECT_EQ(this->kept("large"), "3:" + std::string(100'000, 'x'));
     EXPECT_EQ(this->kept("name", "Software\\Quabble"), "none") << "in the key above";
+    EXPECT_TRUE(this->keep("\xC9", "capital"));
+    EXPECT_EQ(this->kept("\xE9"), "none") << "only ASCII letters are alike";
+    const auto transaction = this->store->begin(Access::Write);
+    EXPECT_TRUE(transaction->set("Software\\Quabble", "above", ValueType::Binary, this->bytes("x")));
+    EXPECT_TRUE(transaction->commit());
+    EXPECT_EQ(this->kept("above", "software\\QUABBLE"), "3:x") << "in a key that came with the one below";
 }
 
 TYPED_TEST_P(RegistryStoreSuite, KeepsAllThatIsCommittedAndNothingElse) {

@@ -1,3 +1,5 @@
+#include <malloc.h>
+
 #include <chrono>
 #include <csignal>
 #include <cstdio>
@@ -10,7 +12,9 @@
 #include "hosts/desktop/sdl_front_end.hpp"
 
 int main() {
-    std::signal(SIGXFSZ, SIG_IGN);  // a file that may not grow is a write that fails
+    constexpr int largeBlock = 256 * 1024;  // bytes
+    mallopt(M_MMAP_THRESHOLD, largeBlock);  // pictures that go leave their memory to the system
+    std::signal(SIGXFSZ, SIG_IGN);          // a file that may not grow is a write that fails
     std::string problem;
     const auto frontEnd = quabble::SdlFrontEnd::open(problem);
     if (!frontEnd) {

@@ -12,7 +12,8 @@
 
 namespace quabble {
 
-// A machine without a screen: windows are pictures in memory, files too, and time passes when told to.
+// A machine without a screen: windows are pictures in memory, files too, and time passes when told to. It
+// holds the program to what a front end may rely on.
 class HeadlessFrontEnd final : public FrontEnd {
  public:
     struct Shown {
@@ -34,7 +35,7 @@ class HeadlessFrontEnd final : public FrontEnd {
     TimePoint now() override { return now_; }
     Scale createWindow(WindowId window, const NativeWindow& traits) override;
     void showPixels(WindowId window, const Surface& picture) override;
-    void closeWindow(WindowId window) override { windows_.erase(window); }
+    void closeWindow(WindowId window) override;
     void minimiseWindow(WindowId window) override;
     void setPointer(WindowId window, PointerShape shape) override { windows_.at(window).pointer = shape; }
     void setTextInput(WindowId window, std::optional<Rect> area) override {
@@ -63,6 +64,8 @@ class HeadlessFrontEnd final : public FrontEnd {
     Files files_;
     std::function<void(const InputEvent&)> post_;
     TimePoint now_;
+    WindowId latest_ = WindowId::none;
+    Scale earlierScale_;
     std::map<WindowId, Shown> windows_;
 };
 
