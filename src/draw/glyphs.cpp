@@ -72,10 +72,11 @@ std::int32_t ScaledFont::wholePixel(double pen) {
 const Glyph& ScaledFont::glyph(char character, double pen) {
     const double fraction = pen - std::floor(pen);
     const auto phase = static_cast<std::size_t>(fraction * phases);
-    std::optional<Glyph>& kept = glyphs_[index(character)][phase];
-    if (!kept)
-        kept = render(character, static_cast<double>(phase) / phases);
-    return *kept;
+    const std::size_t key = index(character) * phases + phase;
+    const auto kept = glyphs_.find(key);
+    if (kept != glyphs_.end())
+        return kept->second;
+    return glyphs_.emplace(key, render(character, static_cast<double>(phase) / phases)).first->second;
 }
 
 Glyph ScaledFont::render(char character, double shift) const {

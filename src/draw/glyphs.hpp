@@ -4,7 +4,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <memory>
-#include <optional>
+#include <unordered_map>
 #include <vector>
 
 #include "draw/text.hpp"
@@ -50,7 +50,7 @@ class ScaledFont {
     std::int32_t ascent_ = 0;
     std::int32_t lineHeight_ = 0;
     std::array<double, 256> advances_{};
-    std::array<std::array<std::optional<Glyph>, phases>, 256> glyphs_{};
+    std::unordered_map<std::size_t, Glyph> glyphs_;  // by character and phase
 };
 
 // The font of a size, made at first use; it lives as long as the program.
