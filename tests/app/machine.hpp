@@ -25,7 +25,7 @@ inline bool isFlat(const Surface& picture, const Rect& area) {
     return colours.size() == 1;
 }
 
-inline HeadlessFrontEnd::Files programFiles() {
+inline HeadlessFrontEnd::Files makeProgramFiles() {
     Surface picture(400, 838);
     for (std::int16_t tile = 0; tile < tiles::count; ++tile)
         picture.fill(Rect::ofSize(tile * 28, 0, 28, 28), tileColour(tile));
@@ -34,10 +34,11 @@ inline HeadlessFrontEnd::Files programFiles() {
     picture.fill(Rect::ofSize(0, 338, 400, 500), {90, 10, 130});
     return {{"ALLPICDATA.BMP", bitmapOf(picture)}};
 }
+inline const HeadlessFrontEnd::Files programFiles = makeProgramFiles();
 
 // The program on its main menu, with high scores that are out of reach. Buttons are counted from 1.
 struct Machine {
-    HeadlessFrontEnd frontEnd{programFiles()};
+    HeadlessFrontEnd frontEnd{programFiles};
     MemoryBlob kept;
     BlobRegistryStore registry{kept};
     Program program;

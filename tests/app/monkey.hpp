@@ -103,7 +103,7 @@ class Monkey {
             EXPECT_FALSE(paused);
         }
         EXPECT_EQ(results_.size(), gamesEnded_);
-        if (upTo(50) == 0)
+        if (upTo(100) == 99)
             checkPainting();
         if (!settled)
             return;
