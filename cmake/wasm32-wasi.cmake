@@ -13,6 +13,9 @@ set(CMAKE_ASM_COMPILER clang-19)
 set(headers /usr/include/wasm32-wasi)
 set(CMAKE_CXX_FLAGS_INIT "-nostdlibinc -isystem ${headers}/c++/v1 -idirafter ${headers} -fno-exceptions -fno-rtti -ffunction-sections -fdata-sections")
 
+# The stack is as large as Windows gives one, and what grows beyond it ends the program instead of writing over its data.
+set(CMAKE_EXE_LINKER_FLAGS_INIT "-Wl,-z,stack-size=1048576,--stack-first")
+
 # Nothing of that machine is to be found, but for its programs.
 set(CMAKE_FIND_ROOT_PATH /usr/lib/wasm32-wasi)
 set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
