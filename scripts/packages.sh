@@ -13,20 +13,20 @@ fail() {
 }
 
 packages_of() {
-    local shared="cmake ninja-build g++ libstb-dev fonts-liberation"
+    local shared="cmake ninja-build libstb-dev fonts-liberation"
     # From Debian 13 and Ubuntu 24.04 on, Sans Narrow is a package of its own.
     case "$1" in
         debian-12) ;;
         debian-13 | ubuntu-24.04) shared+=" fonts-liberation-sans-narrow" ;;
         *) return 1 ;;
     esac
-    local play="$shared pkg-config libsdl2-dev libx11-dev libxext-dev libsqlite3-dev librsvg2-bin xdg-utils"
+    local play="$shared g++ pkg-config libsdl2-dev libx11-dev libxext-dev libsqlite3-dev librsvg2-bin xdg-utils"
     case "$2" in
         play) printf '%s' "$play" ;;
         desktop) printf '%s' "$play libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 cppcheck valgrind" \
             " apngasm xvfb openbox icewm xdotool x11-xserver-utils libxtst-dev" ;;
         web) printf '%s' "$shared libgtest-dev clang-19 lld-19 wasi-libc libc++-19-dev-wasm32 libc++abi-19-dev-wasm32" \
-            " libclang-rt-19-dev-wasm32 nodejs" ;;
+            " libclang-rt-19-dev-wasm32$(command -v node >/dev/null || printf ' nodejs')" ;;  # from wherever it is
         windows) printf '%s' "$shared libgtest-dev g++-mingw-w64-x86-64-posix wine wine64" ;;
         package) printf '%s' "$play dpkg-dev lintian desktop-file-utils appstream man-db groff" ;;
         root) printf 'debootstrap' ;;
