@@ -13,14 +13,14 @@ fail() {
 }
 
 packages_of() {
-    local shared="cmake ninja-build libstb-dev fonts-liberation"
+    local shared="cmake ninja-build g++ libstb-dev librsvg2-bin libharfbuzz-bin fonts-liberation"
     # From Debian 13 and Ubuntu 24.04 on, Sans Narrow is a package of its own.
     case "$1" in
         debian-12) ;;
         debian-13 | ubuntu-24.04) shared+=" fonts-liberation-sans-narrow" ;;
         *) return 1 ;;
     esac
-    local play="$shared g++ pkg-config libsdl2-dev libx11-dev libxext-dev libsqlite3-dev librsvg2-bin xdg-utils"
+    local play="$shared pkg-config libsdl2-dev libx11-dev libxext-dev libsqlite3-dev xdg-utils"
     case "$2" in
         play) printf '%s' "$play" ;;
         desktop) printf '%s' "$play libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 cppcheck valgrind" \
