@@ -2,10 +2,10 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <span>
 #include <vector>
 
+#include "base/cleared_memory.hpp"
 #include "draw/geometry.hpp"
 
 namespace quabble {
@@ -15,25 +15,6 @@ struct Colour {
     std::uint8_t green = 0;
     std::uint8_t blue = 0;
     friend bool operator==(const Colour&, const Colour&) = default;
-};
-
-// Takes memory that the system has cleared, and touches none of it before it is used.
-template <typename T>
-struct ClearedMemory {
-    using value_type = T;
-    T* allocate(std::size_t count) {
-        void* memory = std::calloc(count, sizeof(T));
-        if (memory == nullptr)
-            std::abort();
-        return static_cast<T*>(memory);
-    }
-    void deallocate(T* memory, std::size_t) { std::free(memory); }
-    void construct(T*) {}
-    template <typename From>
-    void construct(T* place, const From& value) {
-        *place = value;
-    }
-    friend bool operator==(const ClearedMemory&, const ClearedMemory&) { return true; }
 };
 
 // A picture in memory, 32 bits a pixel as 0x00RRGGBB, row by row from the top. Every operation is clipped to

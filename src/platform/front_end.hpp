@@ -8,6 +8,7 @@
 #include <string_view>
 #include <vector>
 
+#include "base/cleared_memory.hpp"
 #include "draw/geometry.hpp"
 #include "draw/scale.hpp"
 #include "draw/surface.hpp"
@@ -17,6 +18,8 @@ namespace quabble {
 using Clock = std::chrono::steady_clock;
 using TimePoint = Clock::time_point;
 using std::chrono::milliseconds;
+
+using FileBytes = std::vector<std::byte, ClearedMemory<std::byte>>;
 
 enum class WindowId : std::uint32_t { none = 0 };
 
@@ -75,7 +78,7 @@ class FrontEnd {
     virtual Size screenSize() { return {1024, 768}; }
 
     // The whole of a file that comes with the program; empty when there is none or it cannot be read.
-    virtual std::vector<std::byte> programFile(std::string_view name) = 0;
+    virtual FileBytes programFile(std::string_view name) = 0;
 
     // Opens a web address, which has "://" in it, or a file that comes with the program, by its name, with
     // whatever the machine has for it. That it fails is not reported.

@@ -22,8 +22,8 @@ std::string programFolder() {
     return std::filesystem::read_symlink("/proc/self/exe", unknown).parent_path().string();
 }
 
-std::vector<std::byte> readProgramFile(std::string_view name) {
-    std::vector<std::byte> bytes;
+FileBytes readProgramFile(std::string_view name) {
+    FileBytes bytes;
     const int file =
         ::open(pathOf(name).c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);  // a pipe is not waited for
     if (file < 0)

@@ -1,9 +1,9 @@
 #pragma once
 
-#include <cstddef>
 #include <string>
 #include <string_view>
-#include <vector>
+
+#include "platform/front_end.hpp"
 
 namespace quabble {
 
@@ -11,7 +11,7 @@ namespace quabble {
 std::string programFolder();
 
 // The whole of a file in it; empty when there is none, it is larger than any of ours, or it cannot be read.
-std::vector<std::byte> readProgramFile(std::string_view name);
+FileBytes readProgramFile(std::string_view name);
 
 // A web address as it is, and a file's name with the folder before it.
 std::string pathOrAddress(std::string_view document);

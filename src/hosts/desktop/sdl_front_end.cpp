@@ -284,7 +284,7 @@ Size SdlFrontEnd::screenSize() {
     return {bounds.w, bounds.h};
 }
 
-std::vector<std::byte> SdlFrontEnd::programFile(std::string_view name) {
+FileBytes SdlFrontEnd::programFile(std::string_view name) {
     return readProgramFile(name);
 }
 

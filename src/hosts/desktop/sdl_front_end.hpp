@@ -42,7 +42,7 @@ class SdlFrontEnd final : public FrontEnd {
     std::string clipboardText() override;
     void setClipboardText(const std::string& text) override;
     Size screenSize() override;
-    std::vector<std::byte> programFile(std::string_view name) override;
+    FileBytes programFile(std::string_view name) override;
 
  private:
     SdlFrontEnd() = default;

@@ -44,9 +44,9 @@ void HeadlessFrontEnd::restoreWindow(WindowId window) {
     post_({.window = window, .kind = EventKind::Restored});
 }
 
-std::vector<std::byte> HeadlessFrontEnd::programFile(std::string_view name) {
+FileBytes HeadlessFrontEnd::programFile(std::string_view name) {
     const auto file = files_.find(name);
-    return file == files_.end() ? std::vector<std::byte>() : file->second;
+    return file == files_.end() ? FileBytes() : FileBytes(file->second.begin(), file->second.end());
 }
 
 }  // namespace quabble

@@ -41,7 +41,7 @@ class HeadlessFrontEnd final : public FrontEnd {
     void setTextInput(WindowId window, std::optional<Rect> area) override {
         windows_.at(window).takesText = area.has_value();
     }
-    std::vector<std::byte> programFile(std::string_view name) override;
+    FileBytes programFile(std::string_view name) override;
     void openDocument(std::string_view document) override { openedDocuments.emplace_back(document); }
     std::string clipboardText() override { return clipboard; }
     void setClipboardText(const std::string& text) override { clipboard = text; }
