@@ -13,7 +13,7 @@ fail() {
 }
 
 packages_of() {
-    local shared="cmake ninja-build g++ libstb-dev librsvg2-bin libharfbuzz-bin fonts-liberation"
+    local shared="cmake ninja-build g++ libstb-dev librsvg2-bin libharfbuzz-bin libpng-dev fonts-liberation"
     # From Debian 13 and Ubuntu 24.04 on, Sans Narrow is a package of its own.
     case "$1" in
         debian-12) ;;

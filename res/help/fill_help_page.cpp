@@ -8,7 +8,6 @@
 //   {{gauge 40}}            the gauge of a level, 40 per cent full
 
 #include <stb/stb_image.h>
-#include <stb/stb_image_write.h>
 
 #include <cstdint>
 #include <cstdio>
@@ -22,6 +21,8 @@
 #include <string>
 #include <string_view>
 #include <vector>
+
+#include "write_png.hpp"
 
 namespace {
 
@@ -104,7 +105,7 @@ Picture drawGauge(const Picture& sheet, int percentage) {
             [&](int x, int y) { return sheet.at(x + (100 * y < 241 * percentage ? 274 : 246), y + 29); }};
 }
 
-std::string base64(const std::string& bytes) {
+std::string base64(const std::vector<unsigned char>& bytes) {
     constexpr std::string_view digits = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
     std::string text;
     for (std::size_t i = 0; i < bytes.size(); i += 3) {
@@ -117,12 +118,14 @@ std::string base64(const std::string& bytes) {
     return text;
 }
 
+std::vector<unsigned char> bytesOf(const Picture& picture) {
+    std::vector<unsigned char> bytes(4 * picture.pixels.size());
+    std::memcpy(bytes.data(), picture.pixels.data(), bytes.size());
+    return bytes;
+}
+
 std::string attributesOf(const Picture& picture) {
-    std::string png;
-    const auto append = [](void* out, void* data, int size) {
-        static_cast<std::string*>(out)->append(static_cast<char*>(data), static_cast<std::size_t>(size));
-    };
-    stbi_write_png_to_func(append, &png, picture.width, picture.height, 4, picture.pixels.data(), 0);
+    const auto png = smallestPng(bytesOf(picture), picture.width, picture.height);
     std::ostringstream text;
     text << "width=\"" << picture.width << "\" height=\"" << picture.height
          << "\" style=\"--w:" << picture.width << ";--h:" << picture.height

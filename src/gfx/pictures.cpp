@@ -1,19 +1,19 @@
 #include "gfx/pictures.hpp"
 
 #include <array>
+#include <optional>
+#include <span>
 #include <string>
 
 #include "draw/bitmap_file.hpp"
 #include "draw/canvas.hpp"
 #include "draw/fingerprint.hpp"
-#include "draw/png_file.hpp"
+#include "draw/large_picture.hpp"
 #include "draw/scaling.hpp"
 #include "gfx/palette.hpp"
 
 namespace quabble {
 namespace {
-
-constexpr std::int32_t largeFactor = 4;
 
 constexpr std::array<Colour, tiles::count> standInColours{{{24, 26, 36},
                                                            {214, 69, 65},
@@ -51,6 +51,21 @@ Surface standInSheet() {
     return sheet.picture();
 }
 
+// A large version ends in the fingerprint of the picture that it belongs to, its last byte first: somebody
+// may have put a picture of his own in that one's place.
+std::optional<LargePicture> largeVersion(std::span<const std::byte> file, const Surface& plain) {
+    if (file.size() < fingerprintSize)
+        return std::nullopt;
+    const auto signature = file.last(fingerprintSize);
+    std::uint64_t fingerprint = 0;
+    for (std::size_t i = 0; i < fingerprintSize; ++i)
+        fingerprint |= std::to_integer<std::uint64_t>(signature[i]) << (8 * i);
+    if (fingerprint != fingerprintOf(plain))
+        return std::nullopt;
+    auto large = LargePicture::of(file.first(file.size() - fingerprintSize));
+    return large && large->size() == Size{plain.width(), plain.height()} ? large : std::nullopt;
+}
+
 }  // namespace
 
 const Sprites& Pictures::sprites(Scale scale) {
@@ -60,9 +75,13 @@ const Sprites& Pictures::sprites(Scale scale) {
     const auto sheet = decodeBitmap(frontEnd_.programFile("ALLPICDATA.BMP"));
     if (!sheet || sheet->width() < sheet_map::size.width || sheet->height() < sheet_map::size.height)
         return sprites_.emplace(spritesOf(standInSheet(), scale));
-    const auto largeSheet = scale == Scale() ? std::nullopt : large("ALLPICDATA.PNG", *sheet);
-    return sprites_.emplace(largeSheet ? spritesOf(*largeSheet, largeFactor, scale)
-                                       : spritesOf(*sheet, scale));
+    const FileBytes file = scale == Scale() ? FileBytes() : frontEnd_.programFile("ALLPICDATA.BIG");
+    if (auto large = largeVersion(file, *sheet)) {
+        sprites_ = spritesOf(*large, scale);
+        if (!large->isDamaged())
+            return *sprites_;
+    }
+    return sprites_.emplace(spritesOf(*sheet, scale));
 }
 
 Surface Pictures::backdrop(Scale scale) {
@@ -71,25 +90,13 @@ Surface Pictures::backdrop(Scale scale) {
         return {};
     if (scale == Scale())
         return std::move(*plain);
-    const auto largePicture = large("BGIMG.PNG", *plain);
-    return largePicture ? reduced(*largePicture, largeFactor, scale) : magnified(*plain, scale);
-}
-
-// A large version ends in the fingerprint of the picture that it belongs to, its last byte first: somebody
-// may have put a picture of his own in that one's place.
-std::optional<Surface> Pictures::large(std::string_view name, const Surface& plain) {
-    const auto file = frontEnd_.programFile(name);
-    if (file.size() < fingerprintSize)
-        return std::nullopt;
-    std::uint64_t fingerprint = 0;
-    for (std::size_t i = 0; i < fingerprintSize; ++i)
-        fingerprint |= std::to_integer<std::uint64_t>(file[file.size() - fingerprintSize + i]) << (8 * i);
-    if (fingerprint != fingerprintOf(plain))
-        return std::nullopt;
-    auto picture = decodePng(file);
-    const bool fits = picture && picture->width() == plain.width() * largeFactor &&
-                      picture->height() == plain.height() * largeFactor;
-    return fits ? std::move(picture) : std::nullopt;
+    const FileBytes file = frontEnd_.programFile("BGIMG.BIG");
+    if (auto large = largeVersion(file, *plain)) {
+        Surface picture = reduced(*large, plain->bounds(), scale);
+        if (!large->isDamaged())
+            return picture;
+    }
+    return magnified(*plain, scale);
 }
 
 }  // namespace quabble

@@ -1,7 +1,6 @@
 #pragma once
 
 #include <optional>
-#include <string_view>
 
 #include "draw/scale.hpp"
 #include "gfx/sprites.hpp"
@@ -25,8 +24,6 @@ class Pictures {
     Surface backdrop(Scale scale);
 
  private:
-    std::optional<Surface> large(std::string_view name, const Surface& plain);
-
     FrontEnd& frontEnd_;
     std::optional<Sprites> sprites_;
     Scale scale_;

@@ -3,6 +3,7 @@
 #include <array>
 #include <cstdint>
 
+#include "draw/large_picture.hpp"
 #include "draw/scale.hpp"
 #include "draw/surface.hpp"
 #include "engine/grid_cell.hpp"
@@ -35,7 +36,7 @@ constexpr Rect playPanel = Rect::ofSize(0, 338, 400, 500);
 
 // Makes the sprites from a sheet of at least that size, as it is at scale 1 and magnified at others.
 Sprites spritesOf(const Surface& sheet, Scale scale);
-// Makes them from a sheet that is drawn `factor` times as large.
-Sprites spritesOf(const Surface& largeSheet, std::int32_t factor, Scale scale);
+// Makes them from a large version of a sheet of at least that size.
+Sprites spritesOf(LargePicture& sheet, Scale scale);
 
 }  // namespace quabble

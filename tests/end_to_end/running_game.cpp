@@ -10,7 +10,7 @@
 
 #include "../engine/board_notation.hpp"
 #include "../support/files.hpp"
-#include "draw/png_file.hpp"
+#include "draw/large_picture.hpp"
 #include "gfx/palette.hpp"
 
 namespace quabble {
@@ -31,8 +31,9 @@ void RunningGame::start() {
     if (desktop_.scale() == Scale()) {
         tiles_ = spritesOf(readPicture(folder / "ALLPICDATA.BMP"), Scale()).tiles;
     } else {
-        const std::string large = bytesOf(folder / "ALLPICDATA.PNG");
-        tiles_ = spritesOf(*decodePng(std::as_bytes(std::span(large))), 4, desktop_.scale()).tiles;
+        const std::string file = bytesOf(folder / "ALLPICDATA.BIG");
+        auto large = LargePicture::of(std::as_bytes(std::span(file)));
+        tiles_ = spritesOf(*large, desktop_.scale()).tiles;
     }
     process_ = fork();
     if (process_ == 0) {

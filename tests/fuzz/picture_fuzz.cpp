@@ -4,6 +4,7 @@
 #include <span>
 
 #include "draw/bitmap_file.hpp"
+#include "draw/large_picture.hpp"
 #include "draw/png_file.hpp"
 
 extern "C" int LLVMFuzzerTestOneInput(const unsigned char* data, std::size_t size) {
@@ -14,5 +15,8 @@ extern "C" int LLVMFuzzerTestOneInput(const unsigned char* data, std::size_t siz
            static_cast<std::size_t>(picture->width()) * static_cast<std::size_t>(picture->height()) < size);
     const auto compressed = quabble::decodePng(bytes);
     assert(!compressed || (compressed->width() <= 4096 && compressed->height() <= 4096));
+    // A band is never larger than its picture says.
+    if (auto large = quabble::LargePicture::of(bytes))
+        assert(large->cut({0, 20, 8, 36}).height() == 16 * large->factor());
     return 0;
 }

@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include "../support/bitmap.hpp"
+#include "../support/large_picture_file.hpp"
 #include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/pictures.hpp"
@@ -111,9 +112,11 @@ TEST(Sprites, TakeNoColourFromTheirNeighboursOnTheSheet) {
         expected.fill(expected.bounds(), colour);
         return sprite == expected;
     };
+    const auto file = largePictureFile(flatSheet(4), 4, flatSheet(1));
+    auto large = LargePicture::of(file);
     for (int quarters = 4; quarters <= 16; ++quarters) {
         const Scale scale = Scale::ofQuarters(quarters);
-        for (const Sprites& sprites : {spritesOf(flatSheet(1), scale), spritesOf(flatSheet(4), 4, scale)}) {
+        for (const Sprites& sprites : {spritesOf(flatSheet(1), scale), spritesOf(*large, scale)}) {
             for (std::size_t i = 0; i < 14; ++i) {
                 const auto red = static_cast<std::uint8_t>(10 * i + 5);
                 EXPECT_EQ(sprites.tiles[i].bounds(), (Rect{0, 0, 7 * quarters, 7 * quarters}));
@@ -127,17 +130,30 @@ TEST(Sprites, TakeNoColourFromTheirNeighboursOnTheSheet) {
     }
 }
 
-TEST(Sprites, AreThoseOfThePictureThatIsThere) {
-    Surface own = flatSheet(1);
-    own.fill({0, 0, 28, 28}, {250, 250, 250});
+TEST(Sprites, AreMadeFromALargeVersionThatIsWholeAndBelongsToTheSheet) {
+    const Surface sheet = flatSheet(1);
+    Surface other = sheet;
+    other.fill({0, 0, 28, 28}, {250, 250, 250});
+    Surface finer = flatSheet(4);
+    finer.fill({0, 0, 50, 50}, {250, 250, 250});  // which shows what the sprites were made from
     const Scale scale = Scale::ofQuarters(6);
-    // A large version that belongs to another sheet.
-    HeadlessFrontEnd frontEnd(
-        {{"ALLPICDATA.BMP", bitmapOf(own)}, {"ALLPICDATA.PNG", bitmapOf(flatSheet(1))}});
-    Pictures pictures(frontEnd);
-    EXPECT_TRUE(pictures.sprites(scale).tiles[0] == spritesOf(own, scale).tiles[0]);
-    EXPECT_TRUE(pictures.sprites(Scale()).tiles[0] == spritesOf(own, Scale()).tiles[0])
-        << "the scale changed";
+    const auto isFine = [&](const Surface& plain, const std::vector<std::byte>& file) {
+        HeadlessFrontEnd frontEnd({{"ALLPICDATA.BMP", bitmapOf(plain)}, {"ALLPICDATA.BIG", file}});
+        Pictures pictures(frontEnd);
+        const Sprites sprites = pictures.sprites(scale);
+        EXPECT_TRUE(pictures.sprites(Scale()).tiles[0] == spritesOf(plain, Scale()).tiles[0]);
+        const bool isPlain = sprites.tiles[0] == spritesOf(plain, scale).tiles[0] &&
+                             sprites.playPanel == spritesOf(plain, scale).playPanel;
+        return !isPlain;
+    };
+    const auto whole = largePictureFile(finer, 4, sheet);
+    EXPECT_TRUE(isFine(sheet, whole));
+    EXPECT_FALSE(isFine(other, whole));
+    auto damaged = whole;
+    damaged.erase(damaged.end() - 100, damaged.end() - 50);  // in the last band, which is the panel's
+    EXPECT_FALSE(isFine(sheet, damaged));
+    EXPECT_FALSE(isFine(sheet, largePictureFile(finer, 3, sheet)));
+    EXPECT_FALSE(isFine(sheet, {}));
 }
 
 TEST(Texts, KeysAreReplacedPairByPair) {

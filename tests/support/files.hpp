@@ -47,7 +47,7 @@ inline Surface readPicture(const std::filesystem::path& file) {
 inline std::map<std::string, std::vector<std::byte>, std::less<>> picturesIn(
     const std::filesystem::path& folder) {
     std::map<std::string, std::vector<std::byte>, std::less<>> pictures;
-    for (const char* name : {"ALLPICDATA.BMP", "ALLPICDATA.PNG", "BGIMG.BMP", "BGIMG.PNG"}) {
+    for (const char* name : {"ALLPICDATA.BMP", "ALLPICDATA.BIG", "BGIMG.BMP", "BGIMG.BIG"}) {
         const std::string file = bytesOf(folder / name);
         const auto bytes = std::as_bytes(std::span(file));
         pictures[name].assign(bytes.begin(), bytes.end());
