@@ -1,0 +1,135 @@
+// What the page's script calls. Every function but the first needs `start` before it, and `ended` says when
+// none is to be called any more. A window is given by its number, a place by device pixels of its client
+// area.
+
+#include <cmath>
+#include <cstdint>
+#include <limits>
+#include <memory>
+#include <string>
+
+#include "app/program.hpp"
+#include "hosts/web/page_blob.hpp"
+#include "hosts/web/page_keys.hpp"
+#include "hosts/web/web_front_end.hpp"
+
+#define QUABBLE_EXPORT(name) extern "C" __attribute__((export_name(#name)))
+
+namespace quabble {
+namespace {
+
+// All that lives as long as the page.
+struct Running {
+    WebFrontEnd frontEnd;
+    PageBlob blob;
+    BlobRegistryStore registry{blob};
+    Program program;
+
+    Running(const Page& page, std::uint64_t seed) : frontEnd(page), program(frontEnd, registry, seed) {
+        frontEnd.connect([this](const InputEvent& event) { program.post(event); });
+    }
+};
+
+std::unique_ptr<Running> running;
+std::string text;  // what the page hands over
+
+WindowId idOf(std::uint32_t window) {
+    return static_cast<WindowId>(window);
+}
+
+Page pageOf(std::int32_t width, std::int32_t height, double ratio) {
+    return {.size = {width, height}, .ratio = ratio};
+}
+
+}  // namespace
+
+// Makes room for a text of so many bytes, UTF-8, which the next call takes.
+QUABBLE_EXPORT(textBuffer) char* textBuffer(std::size_t size) {
+    text.assign(size, '\0');
+    return text.data();
+}
+
+// The room for windows in device pixels, how many of them one of the page's pixels has, and what decides
+// every board.
+QUABBLE_EXPORT(start)
+void start(std::int32_t width, std::int32_t height, double ratio, std::uint64_t seed) {
+    running = std::make_unique<Running>(pageOf(width, height, ratio), seed);
+    running->program.start();
+}
+
+QUABBLE_EXPORT(resize) void resize(std::int32_t width, std::int32_t height, double ratio) {
+    running->frontEnd.resize(pageOf(width, height, ratio));
+}
+QUABBLE_EXPORT(takeLargePictures) void takeLargePictures() {
+    running->frontEnd.takeLargePictures();
+}
+QUABBLE_EXPORT(setHidden) void setHidden(bool isHidden) {
+    running->frontEnd.setHidden(isHidden);
+}
+QUABBLE_EXPORT(setMinimised) void setMinimised(std::uint32_t window, bool isMinimised) {
+    running->frontEnd.setMinimised(idOf(window), isMinimised);
+}
+
+QUABBLE_EXPORT(pressMouse) void pressMouse(std::uint32_t window, std::int32_t x, std::int32_t y, bool shift) {
+    running->frontEnd.pressMouse(idOf(window), {x, y}, shift);
+}
+QUABBLE_EXPORT(moveMouse) void moveMouse(std::uint32_t window, std::int32_t x, std::int32_t y) {
+    running->frontEnd.moveMouse(idOf(window), {x, y});
+}
+QUABBLE_EXPORT(releaseMouse) void releaseMouse(std::uint32_t window, std::int32_t x, std::int32_t y) {
+    running->frontEnd.releaseMouse(idOf(window), {x, y});
+}
+QUABBLE_EXPORT(pressCloseButton) void pressCloseButton(std::uint32_t window) {
+    running->program.post({.window = idOf(window), .kind = EventKind::CloseButton});
+}
+
+// The key is the text that was handed over. True when it means something to the program, and so nothing to
+// the browser.
+QUABBLE_EXPORT(pressKey)
+bool pressKey(std::uint32_t window, bool shift, bool ctrl, bool alt, bool altGraph, bool isRepeated) {
+    auto event = translate({.key = text,
+                            .shift = shift,
+                            .ctrl = ctrl,
+                            .alt = alt,
+                            .altGraph = altGraph,
+                            .isRepeated = isRepeated,
+                            .editsText = running->frontEnd.editsText(idOf(window))});
+    if (!event)
+        return false;
+    event->window = idOf(window);
+    running->program.post(*event);
+    return true;
+}
+// The text that was handed over was typed.
+QUABBLE_EXPORT(typeText) void typeText(std::uint32_t window) {
+    running->program.post({.window = idOf(window), .kind = EventKind::TextInput, .text = text});
+}
+QUABBLE_EXPORT(copyText) void copyText(std::uint32_t window) {
+    running->program.post({.window = idOf(window), .kind = EventKind::Edit, .command = EditCommand::Copy});
+}
+QUABBLE_EXPORT(cutText) void cutText(std::uint32_t window) {
+    running->program.post({.window = idOf(window), .kind = EventKind::Edit, .command = EditCommand::Cut});
+}
+QUABBLE_EXPORT(pasteText) void pasteText(std::uint32_t window) {
+    running->program.post({.window = idOf(window), .kind = EventKind::Edit, .command = EditCommand::Paste});
+}
+
+QUABBLE_EXPORT(wake) void wake() {
+    running->program.wake();
+}
+// When to wake the program at the latest, by the page's clock in milliseconds; infinite when it waits for the
+// user.
+QUABBLE_EXPORT(nextDeadline) double nextDeadline() {
+    const auto deadline = running->program.nextDeadline();
+    if (!deadline)
+        return std::numeric_limits<double>::infinity();
+    return std::chrono::duration<double, std::milli>(deadline->time_since_epoch()).count();
+}
+QUABBLE_EXPORT(keep) bool keep() {
+    return running->program.keep();
+}
+QUABBLE_EXPORT(ended) bool ended() {
+    return running->program.ended();
+}
+
+}  // namespace quabble
