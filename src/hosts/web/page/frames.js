@@ -1,0 +1,322 @@
+// The program's windows: frames on the desk, each with a canvas. Sizes and places are in device pixels.
+
+/**
+ * @typedef {import('./program.js').Program} Program
+ * @typedef {{frame: HTMLElement, bar: HTMLElement | null, canvas: HTMLCanvasElement, paint: CanvasRenderingContext2D,
+ *   field: HTMLInputElement | null, owner: number, caption: string, client: number[]}} Shown
+ */
+
+export class Frames {
+  /** @type {Map<number, Shown>} */
+  #windows = new Map();
+  #program;
+  #desk;
+
+  /**
+   * @param {HTMLElement} desk
+   * @param {Program} program
+   */
+  constructor(desk, program) {
+    this.#desk = desk;
+    this.#program = program;
+    addEventListener('resize', () => this.#resize());
+    this.#followRatio();
+  }
+
+  /** What windows have room in: width, height, and how many device pixels one of the page's has. */
+  room() {
+    const {width, height} = this.#desk.getBoundingClientRect();
+    return [Math.floor(width * devicePixelRatio), Math.floor(height * devicePixelRatio), devicePixelRatio];
+  }
+
+  #resize() {
+    this.#program.call('resize', ...this.room());
+  }
+
+  /** Another screen or another zoom. */
+  #followRatio() {
+    const change = () => {
+      this.#resize();
+      this.#followRatio();
+    };
+    matchMedia(`(resolution: ${devicePixelRatio}dppx)`).addEventListener('change', change, {once: true});
+  }
+
+  /**
+   * @param {number} window
+   * @param {number} owner 0 for a window that is no dialog
+   * @param {boolean} isBorderless
+   * @param {string} caption
+   */
+  create(window, owner, isBorderless, caption) {
+    const frame = document.createElement('section');
+    frame.className = 'frame';
+    frame.ariaLabel = caption;
+    if (owner !== 0) {
+      frame.role = 'dialog';
+      frame.ariaModal = 'true';
+    }
+    const canvas = document.createElement('canvas');
+    canvas.tabIndex = 0;
+    const paint = /** @type {CanvasRenderingContext2D} */ (canvas.getContext('2d', {alpha: false}));
+    const bar = isBorderless ? null : this.#makeBar(window, owner, caption);
+    frame.append(...(bar === null ? [canvas] : [bar, canvas]));
+    this.#windows.set(window, {frame, bar, canvas, paint, field: null, owner, caption, client: []});
+    this.#listen(window, frame, canvas);
+    this.#desk.append(frame);
+    this.#letOneTakeInput();
+  }
+
+  /**
+   * @param {number} window
+   * @param {number} owner
+   * @param {string} caption
+   */
+  #makeBar(window, owner, caption) {
+    const bar = document.createElement('div');
+    bar.className = 'bar';
+    const title = document.createElement('span');
+    title.textContent = caption;
+    bar.append(title);
+    /** @param {string} name @param {string} sign @param {() => void} act */
+    const addButton = (name, sign, act) => {
+      const button = document.createElement('button');
+      button.className = name.toLowerCase();
+      button.ariaLabel = name;
+      button.textContent = sign;
+      button.addEventListener('click', act);
+      bar.append(button);
+    };
+    if (owner === 0) {
+      addButton('Minimise', '\u2013', () => {
+        this.minimise(window);
+        this.#program.call('setMinimised', window, true);
+      });
+    }
+    addButton('Close', '\u2715', () => this.#program.call('pressCloseButton', window));
+    return bar;
+  }
+
+  /** While a dialog is open the windows below it, and what else is on the page, take no input. */
+  #letOneTakeInput() {
+    const shown = [...this.#windows.values()];
+    const isModal = shown.some((window) => window.owner !== 0);
+    for (const window of shown) window.frame.inert = isModal && window !== shown.at(-1);
+  }
+
+  /**
+   * @param {number} window
+   * @param {number[]} places the frame's left, top, width and height, and in it the client area's
+   */
+  place(window, places) {
+    const shown = this.#windows.get(window);
+    if (shown === undefined) return;
+    shown.client = places.slice(4);
+    lay(shown.frame, places);
+    lay(shown.canvas, shown.client);
+    if (shown.bar !== null) shown.bar.style.height = css(shown.client[1]);
+    this.#sharpen(shown);
+  }
+
+  /** A picture that is shown one to one has sharp pixels; the others are only there until one that fits has come.
+   * @param {Shown} shown
+   */
+  #sharpen({canvas, client}) {
+    canvas.style.imageRendering = canvas.width === client[2] && canvas.height === client[3] ? 'pixelated' : 'auto';
+  }
+
+  /**
+   * @param {number} window
+   * @param {number} width
+   * @param {number} height
+   * @param {number} top
+   * @param {Uint8Array} pixels
+   */
+  show(window, width, height, top, pixels) {
+    const shown = this.#windows.get(window);
+    if (shown === undefined) return;
+    const {canvas, paint, frame} = shown;
+    if (canvas.width !== width || canvas.height !== height) {
+      canvas.width = width;
+      canvas.height = height;
+      this.#sharpen(shown);
+    }
+    const bytes = new Uint8ClampedArray(/** @type {ArrayBuffer} */ (pixels.buffer), pixels.byteOffset, pixels.length);
+    paint.putImageData(new ImageData(bytes, width), 0, top);
+    if (!frame.classList.contains('seen')) {
+      frame.classList.add('seen');
+      (shown.field ?? canvas).focus();
+    }
+  }
+
+  /** @param {number} window */
+  close(window) {
+    const shown = this.#windows.get(window);
+    if (shown === undefined) return;
+    this.#windows.delete(window);
+    shown.frame.remove();
+    this.#letOneTakeInput();
+    const owner = this.#windows.get(shown.owner);
+    (owner?.field ?? owner?.canvas)?.focus();
+  }
+
+  /** @param {number} window */
+  minimise(window) {
+    const shown = this.#windows.get(window);
+    if (shown === undefined || shown.frame.hidden) return;
+    shown.frame.hidden = true;
+    const button = document.createElement('button');
+    button.className = 'minimised';
+    button.textContent = shown.caption;
+    button.addEventListener('click', () => {
+      button.remove();
+      shown.frame.hidden = false;
+      shown.canvas.focus();
+      this.#program.call('setMinimised', window, false);
+    });
+    this.#desk.append(button);
+    button.focus();
+  }
+
+  /** @param {number} window @param {boolean} isHand */
+  setPointer(window, isHand) {
+    const shown = this.#windows.get(window);
+    if (shown !== undefined) shown.canvas.style.cursor = isHand ? 'pointer' : 'default';
+  }
+
+  // --- Input ---
+
+  /**
+   * A touch is a click when it ends, for it may become a pinch; it has no hover, so the pointer moves there first.
+   * @param {number} window
+   * @param {HTMLElement} frame
+   * @param {HTMLCanvasElement} canvas
+   */
+  #listen(window, frame, canvas) {
+    /** @param {PointerEvent} event */
+    const placeOf = (event) => {
+      const area = canvas.getBoundingClientRect();
+      const client = this.#windows.get(window)?.client ?? [0, 0, 0, 0];
+      return [
+        Math.floor(((event.clientX - area.left) * client[2]) / area.width),
+        Math.floor(((event.clientY - area.top) * client[3]) / area.height),
+      ];
+    };
+    /** @param {PointerEvent} event */
+    const press = (event) => {
+      this.#program.call('moveMouse', window, ...placeOf(event));
+      this.#program.call('pressMouse', window, ...placeOf(event), event.shiftKey);
+    };
+    canvas.addEventListener('pointerdown', (event) => {
+      if (event.pointerType === 'touch' || event.button > 2) return;
+      canvas.setPointerCapture(event.pointerId);
+      press(event);
+    });
+    canvas.addEventListener('pointermove', (event) => {
+      if (event.pointerType !== 'touch') this.#program.call('moveMouse', window, ...placeOf(event));
+    });
+    canvas.addEventListener('pointerup', (event) => {
+      if (event.pointerType === 'touch') press(event);
+      this.#program.call('releaseMouse', window, ...placeOf(event));
+    });
+    canvas.addEventListener('mousedown', (event) => {
+      event.preventDefault(); // the keyboard stays where it is, or goes to the text field
+      (this.#windows.get(window)?.field ?? canvas).focus();
+    });
+    canvas.addEventListener('contextmenu', (event) => event.preventDefault());
+    frame.addEventListener('keydown', (event) => this.#pressKey(window, event));
+  }
+
+  /** @param {number} window @param {KeyboardEvent} event */
+  #pressKey(window, event) {
+    if (event.isComposing || event.target instanceof HTMLButtonElement) return;
+    const {key, shiftKey, ctrlKey, metaKey, altKey, repeat} = event;
+    const altGraph = event.getModifierState('AltGraph');
+    const isTaken = this.#program.callWithText(
+      key, 'pressKey', window, shiftKey, ctrlKey || metaKey, altKey, altGraph, repeat);
+    const isTyped = event.target instanceof HTMLInputElement && [...key].length === 1 && !ctrlKey && !metaKey;
+    if (isTaken && !isTyped) event.preventDefault();
+  }
+
+  // --- Text ---
+
+  /**
+   * While the window takes text, a field that is not seen lies over the place where it is typed.
+   * @param {number} window
+   * @param {number[]} place left, top, width and height; without a width there is none
+   */
+  setTextField(window, [left, top, width, height]) {
+    const shown = this.#windows.get(window);
+    if (shown === undefined) return;
+    if (width === 0) {
+      if (shown.field === document.activeElement) shown.canvas.focus();
+      shown.field?.remove();
+      shown.field = null;
+      return;
+    }
+    if (shown.field === null) {
+      shown.field = this.#makeField(window);
+      shown.frame.append(shown.field);
+      if (shown.frame.classList.contains('seen')) shown.field.focus();
+    }
+    lay(shown.field, [shown.client[0] + left, shown.client[1] + top, width, height]);
+  }
+
+  /** @param {number} window */
+  #makeField(window) {
+    const field = document.createElement('input');
+    Object.assign(field, {type: 'text', autocomplete: 'off', spellcheck: false, enterKeyHint: 'done'});
+    field.setAttribute('autocorrect', 'off');
+    field.ariaLabel = 'Enter Your Name';
+    // Something to delete, without which keyboards on a screen report no deletion.
+    const empty = () => {
+      field.value = ' ';
+      field.setSelectionRange(1, 1);
+    };
+    empty();
+    /** @param {string | null} text */
+    const type = (text) => {
+      if (text) this.#program.callWithText(text, 'typeText', window);
+    };
+    field.addEventListener('beforeinput', (event) => {
+      if (event.isComposing || event.inputType === 'insertCompositionText') return;
+      event.preventDefault();
+      if (event.inputType === 'deleteContentBackward')
+        this.#program.callWithText('Backspace', 'pressKey', window, false, false, false, false, false);
+      else if (event.inputType !== 'insertLineBreak') type(event.data);
+    });
+    field.addEventListener('compositionstart', () => {
+      field.value = '';
+      field.classList.add('composing');
+    });
+    field.addEventListener('compositionend', (event) => {
+      field.classList.remove('composing');
+      empty();
+      type(event.data);
+    });
+    field.addEventListener('paste', (event) => {
+      event.preventDefault();
+      this.#program.clipboard = event.clipboardData?.getData('text/plain') ?? '';
+      this.#program.call('pasteText', window);
+    });
+    for (const act of /** @type {const} */ (['copy', 'cut'])) {
+      field.addEventListener(act, (event) => {
+        event.preventDefault();
+        this.#program.clipboard = '';
+        this.#program.call(`${act}Text`, window);
+        if (this.#program.clipboard !== '') event.clipboardData?.setData('text/plain', this.#program.clipboard);
+      });
+    }
+    return field;
+  }
+}
+
+/** @param {number} devicePixels */
+function css(devicePixels) {
+  return `${devicePixels / devicePixelRatio}px`;
+}
+
+/** @param {HTMLElement} element @param {number[]} place */
+function lay(element, [left, top, width, height]) {
+  Object.assign(element.style, {left: css(left), top: css(top), width: css(width), height: css(height)});
+}

@@ -1,0 +1,62 @@
+// What is kept between visits: one text in the browser's storage, a character for each byte.
+
+const name = 'quabble';
+
+/**
+ * Asks for the right to keep things; only one page at a time has it.
+ * @returns {Promise<boolean>}
+ */
+function isOnlyPage() {
+  if (!navigator.locks) return Promise.resolve(true);
+  return new Promise((answer) => {
+    const held = navigator.locks.request(name, {ifAvailable: true}, (lock) => {
+      answer(lock !== null);
+      return lock && new Promise(() => {}); // held until the page goes
+    });
+    held.catch(() => answer(true));
+  });
+}
+
+/** The storage, or why nothing can be kept in it. */
+export class Keeping {
+  /** What lies there, as far as we know: nobody else's is written over. */
+  #known = /** @type {string | null} */ (null);
+  #isRead = false;
+  isElsewhere = false;
+
+  static async open() {
+    const keeping = new Keeping();
+    keeping.isElsewhere = !(await isOnlyPage());
+    return keeping;
+  }
+
+  /** Whether it could be read when it was last asked for; if not, the program has told the player. */
+  get isReadable() {
+    return this.#isRead;
+  }
+
+  /** @returns {Uint8Array | null} */
+  read() {
+    try {
+      this.#known = localStorage.getItem(name);
+      this.#isRead = true;
+      return Uint8Array.from(this.#known ?? '', (character) => character.charCodeAt(0));
+    } catch {
+      this.#isRead = false;
+      return null;
+    }
+  }
+
+  /** @param {Uint8Array} bytes */
+  write(bytes) {
+    try {
+      if (this.isElsewhere || localStorage.getItem(name) !== this.#known) return false;
+      const text = String.fromCharCode(...bytes);
+      localStorage.setItem(name, text);
+      this.#known = text;
+      return true;
+    } catch {
+      return false;
+    }
+  }
+}

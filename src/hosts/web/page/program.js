@@ -1,0 +1,176 @@
+// The program: calls into it, what it asks of the page, and the one alarm that wakes it.
+
+/**
+ * @typedef {import('./frames.js').Frames} Frames
+ * @typedef {import('./keeping.js').Keeping} Keeping
+ * @typedef {import('./parts.js').Files} Files
+ * @typedef {Record<string, (...values: any[]) => any> & {memory: WebAssembly.Memory}} Exports
+ */
+
+export class Program {
+  #exports = /** @type {Exports} */ ({});
+  #alarm = 0;
+  #isOver = false;
+  #failure = /** @type {unknown} */ (null); // of something that the program asked for
+  #asked = /** @type {Uint8Array} */ (new Uint8Array());
+  /** What was cut or copied last, and what is to be pasted. */
+  clipboard = '';
+
+  /**
+   * @param {Files} files
+   * @param {Keeping} keeping
+   * @param {{end: (isKept: boolean) => void, fail: (reason: unknown) => void, open: (document: string) => void}} page
+   */
+  constructor(files, keeping, page) {
+    this.files = files;
+    this.keeping = keeping;
+    this.page = page;
+  }
+
+  /**
+   * @param {Frames} frames
+   * @param {bigint} seed
+   */
+  async start(frames, seed) {
+    const module = this.files.get('quabble.wasm') ?? new Uint8Array();
+    const {instance} = await WebAssembly.instantiate(/** @type {BufferSource} */ (module), this.#imports(frames));
+    this.files.delete('quabble.wasm');
+    this.#exports = /** @type {any} */ (instance.exports);
+    this.#exports._initialize();
+    this.call('start', ...frames.room(), seed);
+  }
+
+  /**
+   * Calls one of the program's functions and lets it go on. Nothing is returned once it has ended or failed.
+   * @param {string} name
+   * @param {...any} values
+   */
+  call(name, ...values) {
+    if (this.#isOver) return undefined;
+    try {
+      const result = this.#exports[name](...values);
+      this.#exports.wake();
+      if (this.#failure !== null) throw this.#failure;
+      this.#settle();
+      return result;
+    } catch (error) {
+      this.#isOver = true;
+      clearTimeout(this.#alarm);
+      this.page.fail(error);
+      return undefined;
+    }
+  }
+
+  /**
+   * The same for a function that takes a text.
+   * @param {string} text
+   * @param {string} name
+   * @param {...any} values
+   */
+  callWithText(text, name, ...values) {
+    if (this.#isOver) return undefined;
+    const bytes = new TextEncoder().encode(text);
+    const place = this.#exports.textBuffer(bytes.length);
+    new Uint8Array(this.#exports.memory.buffer, place, bytes.length).set(bytes);
+    return this.call(name, ...values);
+  }
+
+  /** Saves what should last; false when it could not be kept. */
+  keep() {
+    return this.#isOver || this.call('keep') === 1;
+  }
+
+  #settle() {
+    clearTimeout(this.#alarm);
+    if (this.#exports.ended()) {
+      this.#isOver = true;
+      this.page.end(this.#exports.keep() === 1);
+      return;
+    }
+    const deadline = this.#exports.nextDeadline();
+    if (deadline < Infinity)
+      this.#alarm = setTimeout(() => this.call('wake'), Math.max(0, Math.ceil(deadline - performance.now())));
+  }
+
+  /** @param {number} at @param {number} size */
+  bytesAt(at, size) {
+    return new Uint8Array(this.#exports.memory.buffer, at, size);
+  }
+
+  /** @param {number} at @param {number} size */
+  #textAt(at, size) {
+    return new TextDecoder().decode(this.bytesAt(at, size));
+  }
+
+  /** @param {Uint8Array | undefined} bytes */
+  #ask(bytes) {
+    this.#asked = bytes ?? new Uint8Array();
+    return this.#asked.length;
+  }
+
+  /**
+   * What the program asks of the page, as src/hosts/web/page.hpp has it. Nothing is thrown through the program: what goes
+   * wrong is remembered, and the program is given up when it comes back.
+   * @param {Frames} frames
+   * @returns {WebAssembly.Imports}
+   */
+  #imports(frames) {
+    /** @type {Record<string, (...values: any[]) => any>} */
+    const page = {
+      now: () => performance.now(),
+      createWindow: (window, owner, isBorderless, caption, size) =>
+        frames.create(window, owner, isBorderless !== 0, this.#textAt(caption, size)),
+      placeWindow: (window, ...places) => frames.place(window, places),
+      showRows: (window, width, height, top, rows, pixels) =>
+        frames.show(window, width, height, top, this.bytesAt(pixels, width * rows * 4)),
+      closeWindow: (window) => frames.close(window),
+      minimiseWindow: (window) => frames.minimise(window),
+      setPointer: (window, isHand) => frames.setPointer(window, isHand !== 0),
+      setTextField: (window, ...place) => frames.setTextField(window, place),
+      openDocument: (document, size) => this.page.open(this.#textAt(document, size)),
+      fileSize: (file, size) => this.#ask(this.files.get(this.#textAt(file, size))),
+      clipboardSize: () => this.#ask(new TextEncoder().encode(this.clipboard)),
+      storageSize: () => {
+        const kept = this.keeping.read();
+        return kept === null ? -1 : this.#ask(kept);
+      },
+      take: (to) => this.bytesAt(to, this.#asked.length).set(this.#asked),
+      setClipboard: (text, size) => void (this.clipboard = this.#textAt(text, size)),
+      writeStorage: (bytes, size) => this.keeping.write(this.bytesAt(bytes, size).slice()),
+    };
+    for (const [name, act] of Object.entries(page)) {
+      page[name] = (...values) => {
+        try {
+          return act(...values);
+        } catch (error) {
+          this.#failure ??= error;
+          return 0;
+        }
+      };
+    }
+    const isNoFile = () => 8; // EBADF
+    return {
+      page,
+      wasi_snapshot_preview1: {fd_write: this.#writeError.bind(this), fd_seek: isNoFile, fd_close: isNoFile},
+    };
+  }
+
+  /**
+   * What a broken assertion says goes to the console, as a program's words go to its standard error.
+   * @param {number} _file
+   * @param {number} pieces
+   * @param {number} count
+   * @param {number} written
+   */
+  #writeError(_file, pieces, count, written) {
+    const memory = new DataView(this.#exports.memory.buffer);
+    let size = 0;
+    for (let i = 0; i < count; ++i) {
+      const length = memory.getUint32(pieces + 8 * i + 4, true);
+      console.error(this.#textAt(memory.getUint32(pieces + 8 * i, true), length));
+      size += length;
+    }
+    memory.setUint32(written, size, true);
+    return 0;
+  }
+}
