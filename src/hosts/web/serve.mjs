@@ -1,4 +1,6 @@
-// Serves a folder on this machine alone, as any web server would: node serve.mjs FOLDER
+// Serves a folder on this machine alone, as any web server would: node serve.mjs FOLDER [open]
+// With the word "open" a browser is asked to show it.
+import {spawn} from 'node:child_process';
 import {createServer} from 'node:http';
 import {readFile} from 'node:fs/promises';
 import {extname, join, normalize} from 'node:path';
@@ -26,9 +28,20 @@ export function serve(folder, port = 0, answered = () => {}) {
       answered(path, 0);
     }
   });
-  return new Promise((resolve) => server.listen(port, '127.0.0.1', () => resolve(server)));
+  return new Promise((resolve, reject) => server.on('error', reject).listen(port, '127.0.0.1', () => resolve(server)));
 }
 
 export const addressOf = (server) => `http://localhost:${server.address().port}/`;
 
-if (import.meta.url === pathToFileURL(process.argv[1]).href) console.log(addressOf(await serve(process.argv[2])));
+if (import.meta.url === pathToFileURL(process.argv[1]).href) {
+  // A browser keeps what is to last with the address, so it is the same one each time, unless somebody else has it.
+  const usualPort = 8642;
+  const server = await serve(process.argv[2], usualPort).catch(() => serve(process.argv[2]));
+  const address = addressOf(server);
+  console.log(address);
+  if (process.argv[3] === 'open') {
+    const browser = spawn('xdg-open', [address], {stdio: 'ignore', detached: true});
+    browser.on('error', () => console.log('No browser could be opened; open this address in one.'));
+    browser.unref();
+  }
+}
