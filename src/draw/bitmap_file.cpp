@@ -63,8 +63,8 @@ std::optional<Surface> decodeBitmap(std::span<const std::byte> file) {
         const auto stored = static_cast<std::size_t>(layout->topDown ? y : layout->height - 1 - y);
         const std::byte* from = file.data() + layout->pixelsAt + stored * layout->stride;
         for (std::uint32_t& pixel : picture.row(y)) {
-            pixel = std::to_integer<std::uint32_t>(from[0]) | std::to_integer<std::uint32_t>(from[1]) << 8 |
-                    std::to_integer<std::uint32_t>(from[2]) << 16;
+            pixel = pixelOf({std::to_integer<std::uint8_t>(from[2]), std::to_integer<std::uint8_t>(from[1]),
+                             std::to_integer<std::uint8_t>(from[0])});
             from += 3;
         }
     }

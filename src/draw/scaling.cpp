@@ -29,7 +29,7 @@ std::uint32_t mixed(std::uint32_t one, std::uint32_t other, std::uint32_t weight
     constexpr std::uint32_t green = 0x00FF00;
     const std::uint32_t rest = 256 - weight;
     return (((one & redAndBlue) * rest + (other & redAndBlue) * weight) >> 8 & redAndBlue) |
-           (((one & green) * rest + (other & green) * weight) >> 8 & green);
+           (((one & green) * rest + (other & green) * weight) >> 8 & green) | pixel_layout::opaque;
 }
 
 // A pixel is seen where its centre is.

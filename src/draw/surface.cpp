@@ -23,7 +23,10 @@ void copyLine(const std::uint32_t* from, std::size_t width, std::uint32_t* to) {
 Surface::Surface(std::int32_t width, std::int32_t height)
     : width_(width),
       height_(height),
-      pixels_(static_cast<std::size_t>(width) * static_cast<std::size_t>(height)) {}
+      pixels_(static_cast<std::size_t>(width) * static_cast<std::size_t>(height)) {
+    if constexpr (pixelOf({}) != 0)
+        std::ranges::fill(pixels_, pixelOf({}));
+}
 
 Colour Surface::at(std::int32_t x, std::int32_t y) const {
     assert(bounds().contains(x, y));

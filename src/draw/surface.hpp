@@ -17,7 +17,31 @@ struct Colour {
     friend bool operator==(const Colour&, const Colour&) = default;
 };
 
-// A picture in memory, 32 bits a pixel as 0x00RRGGBB, row by row from the top. Every operation is clipped to
+// How a pixel lies in its 32 bits: as the machine shows it, so that showing a picture turns nothing over. It
+// is 0x00RRGGBB, and for a page in a browser 0xFFBBGGRR.
+namespace pixel_layout {
+#ifdef __wasm__
+constexpr int red = 0, green = 8, blue = 16;
+constexpr std::uint32_t opaque = 0xFF000000;
+#else
+constexpr int red = 16, green = 8, blue = 0;
+constexpr std::uint32_t opaque = 0;
+#endif
+}  // namespace pixel_layout
+
+constexpr std::uint32_t pixelOf(Colour colour) {
+    return std::uint32_t{colour.red} << pixel_layout::red |
+           std::uint32_t{colour.green} << pixel_layout::green |
+           std::uint32_t{colour.blue} << pixel_layout::blue | pixel_layout::opaque;
+}
+
+constexpr Colour colourOf(std::uint32_t pixel) {
+    return {static_cast<std::uint8_t>(pixel >> pixel_layout::red),
+            static_cast<std::uint8_t>(pixel >> pixel_layout::green),
+            static_cast<std::uint8_t>(pixel >> pixel_layout::blue)};
+}
+
+// A picture in memory, 32 bits a pixel, row by row from the top. Every operation is clipped to
 // the surface, and copies to the source as well, so no rectangle is ever wrong.
 class Surface {
  public:
@@ -54,14 +78,5 @@ class Surface {
     std::int32_t height_ = 0;
     std::vector<std::uint32_t, ClearedMemory<std::uint32_t>> pixels_;
 };
-
-constexpr std::uint32_t pixelOf(Colour colour) {
-    return (std::uint32_t{colour.red} << 16) | (std::uint32_t{colour.green} << 8) | colour.blue;
-}
-
-constexpr Colour colourOf(std::uint32_t pixel) {
-    return {static_cast<std::uint8_t>(pixel >> 16), static_cast<std::uint8_t>(pixel >> 8),
-            static_cast<std::uint8_t>(pixel)};
-}
 
 }  // namespace quabble

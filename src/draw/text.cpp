@@ -10,10 +10,10 @@ namespace {
 // Mixes a colour into a pixel, `coverage` 0 (not at all) to 255 (wholly).
 std::uint32_t blend(std::uint32_t pixel, Colour colour, std::uint32_t coverage) {
     const auto mix = [coverage](std::uint32_t below, std::uint32_t above) {
-        return (below * (255 - coverage) + above * coverage + 127) / 255;
+        return static_cast<std::uint8_t>((below * (255 - coverage) + above * coverage + 127) / 255);
     };
     const Colour held = colourOf(pixel);
-    return mix(held.red, colour.red) << 16 | mix(held.green, colour.green) << 8 | mix(held.blue, colour.blue);
+    return pixelOf({mix(held.red, colour.red), mix(held.green, colour.green), mix(held.blue, colour.blue)});
 }
 
 void paintGlyph(Surface& surface, const Rect& clip, const Glyph& glyph, Point origin, Colour colour) {

@@ -15,7 +15,9 @@ namespace quabble {
 constexpr Colour maskColour{0x55, 0x33, 0x0F};
 constexpr Colour fullGaugeColour{250, 251, 252};
 inline Colour tileColour(std::int16_t tile) {
-    return colourOf(static_cast<std::uint32_t>(0x0AF000 + tile * 0x11F035));
+    const int mixed = 0x0AF000 + tile * 0x11F035;
+    return {static_cast<std::uint8_t>(mixed >> 16), static_cast<std::uint8_t>(mixed >> 8),
+            static_cast<std::uint8_t>(mixed)};
 }
 
 inline bool isFlat(const Surface& picture, const Rect& area) {

@@ -13,7 +13,10 @@ namespace {
 Surface pixels(std::string_view digits) {
     Surface surface = digits.size() == 12 ? Surface(4, 3) : Surface(3, 2);
     for (std::int32_t y = 0; y < surface.height(); ++y)
-        std::ranges::copy_n(digits.begin() + y * surface.width(), surface.width(), surface.row(y).begin());
+        std::ranges::transform(
+            digits.substr(static_cast<std::size_t>(y * surface.width()), surface.row(y).size()),
+            surface.row(y).begin(),
+            [](char digit) { return static_cast<std::uint32_t>(digit) | pixel_layout::opaque; });
     return surface;
 }
 

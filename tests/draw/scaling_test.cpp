@@ -77,7 +77,8 @@ TEST(Reduced, IsTheMeanOfWhatAPixelCovers) {
 TEST(Magnifier, RepeatsPixelsAtWholeScalesAndMixesNeighboursAtOthers) {
     Surface picture(7, 5);  // its red tells the column and its blue the row
     for (std::int32_t i = 0; i < 35; ++i)
-        picture.row(i / 7)[static_cast<std::size_t>(i % 7)] = static_cast<std::uint32_t>(i % 7 << 16 | i / 7);
+        picture.row(i / 7)[static_cast<std::size_t>(i % 7)] =
+            pixelOf({static_cast<std::uint8_t>(i % 7), 0, static_cast<std::uint8_t>(i / 7)});
     for (const Size& shown : {Size{7, 5}, {14, 10}, {21, 15}, {9, 6}, {10, 8}, {4, 3}}) {
         Surface screen(shown.width + 1, shown.height);
         screen.fill(screen.bounds(), {1, 2, 3});

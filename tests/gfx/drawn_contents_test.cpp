@@ -16,7 +16,7 @@ class Painters : public testing::Test {
  protected:
     Painters() {
         for (std::uint32_t i = 0; i < 838 * 400; ++i)
-            sheet.row(static_cast<std::int32_t>(i / 400))[i % 400] = i;
+            sheet.row(static_cast<std::int32_t>(i / 400))[i % 400] = i | pixel_layout::opaque;
     }
     Surface sheet{400, 838};  // every pixel is another one
     static constexpr Font font{Typeface::SansBold, 14};

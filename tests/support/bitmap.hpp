@@ -25,8 +25,10 @@ inline std::vector<std::byte> bitmapOf(const Surface& picture) {
     for (const std::uint32_t number : {0U, row * height, 0U, 0U, 0U, 0U})
         add(number, 4);
     for (std::int32_t y = picture.height() - 1; y >= 0; --y) {
-        for (const std::uint32_t pixel : picture.row(y))
-            add(pixel, 3);
+        for (const std::uint32_t pixel : picture.row(y)) {
+            const Colour colour = colourOf(pixel);
+            add(std::uint32_t{colour.red} << 16 | std::uint32_t{colour.green} << 8 | colour.blue, 3);
+        }
         add(0, static_cast<int>(row - 3 * width));
     }
     return file;

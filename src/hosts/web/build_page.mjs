@@ -10,10 +10,13 @@ import * as esbuild from 'esbuild';
 
 const [filesFolder, out] = process.argv.slice(2);
 const page = join(import.meta.dirname ?? new URL('.', import.meta.url).pathname, 'page');
-const firstFiles = ['quabble.wasm', 'ALLPICDATA.BMP', 'BGIMG.BMP'];
+const pictures = ['ALLPICDATA.BMP', 'BGIMG.BMP'];
 const largePictures = ['ALLPICDATA.BIG', 'BGIMG.BIG'];
 const helpPage = 'QB_HELP.HTM';
 const icons = [192, 512];
+
+const compressed = (bytes) => gzipSync(bytes, {level: 9});
+const program = compressed(readFileSync(join(filesFolder, 'quabble.wasm')));
 
 /** The form is described in page/parts.js. */
 function pack(names) {
@@ -21,7 +24,7 @@ function pack(names) {
   const list = Buffer.from(JSON.stringify(names.map((name, i) => [name, files[i].length])));
   const length = Buffer.alloc(4);
   length.writeUInt32LE(list.length);
-  return gzipSync(Buffer.concat([length, list, ...files]), {level: 9});
+  return compressed(Buffer.concat([length, list, ...files]));
 }
 
 /** Seven bits a character; a page does not keep 0, line ends as they are and what begins a tag. */
@@ -65,7 +68,8 @@ const icon = (width) => readFileSync(join(filesFolder, `icon_${width}.png`));
 
 const siteFiles = {
   'index.html': fill('<link rel="manifest" href="manifest.webmanifest">\n<link rel="icon" href="icon_192.png">', '', "'self'"),
-  'first.data': pack(firstFiles),
+  'program.data': program,
+  'pictures.data': pack(pictures),
   'rest.data': pack(largePictures),
   'manifest.webmanifest': JSON.stringify({
     id: 'quabble', name: 'Quabble', short_name: 'Quabble', start_url: '.', display: 'standalone', orientation: 'landscape',
@@ -87,7 +91,7 @@ const {code: worker} = await esbuild.transform(readFileSync(join(page, 'service_
 siteFiles['service_worker.js'] = worker;
 for (const [name, content] of Object.entries(siteFiles)) writeFileSync(join(site, name), content);
 
-const data = [['first', firstFiles], ['rest', [...largePictures, helpPage]]].map(
-  ([name, files]) => `<script type="text/plain" id="${name}">${asText(pack(files))}</script>`);
+const inside = {program, pictures: pack(pictures), rest: pack([...largePictures, helpPage])};
+const data = Object.entries(inside).map(([name, bytes]) => `<script type="text/plain" id="${name}">${asText(bytes)}</script>`);
 const inlineIcon = `<link rel="icon" href="data:image/png;base64,${readFileSync(join(filesFolder, 'icon_64.png')).toString('base64')}">`;
 writeFileSync(join(out, 'quabble.html'), fill(inlineIcon, data.join('\n'), "'none'"));

@@ -19,10 +19,9 @@ QUABBLE_PAGE("placeWindow")
 void placeWindow(std::uint32_t window, std::int32_t left, std::int32_t top, std::int32_t width,
                  std::int32_t height, std::int32_t clientLeft, std::int32_t clientTop,
                  std::int32_t clientWidth, std::int32_t clientHeight);
-// Some rows of a picture of that size, from the top one given, as red, green, blue and 255 for each pixel.
-QUABBLE_PAGE("showRows")
-void showRows(std::uint32_t window, std::int32_t width, std::int32_t height, std::int32_t top,
-              std::int32_t rows, const std::uint32_t* pixels);
+// A picture of the client area, at whatever scale: red, green, blue and 255 for each pixel.
+QUABBLE_PAGE("showPixels")
+void showPixels(std::uint32_t window, std::int32_t width, std::int32_t height, const std::uint32_t* pixels);
 QUABBLE_PAGE("closeWindow") void closeWindow(std::uint32_t window);
 QUABBLE_PAGE("minimiseWindow") void minimiseWindow(std::uint32_t window);
 QUABBLE_PAGE("setPointer") void setPointer(std::uint32_t window, bool isHand);

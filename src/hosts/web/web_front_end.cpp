@@ -6,7 +6,6 @@
 
 #include "draw/scaling.hpp"
 #include "hosts/web/page.hpp"
-#include "hosts/web/page_pixels.hpp"
 
 namespace quabble {
 namespace {
@@ -51,7 +50,7 @@ void WebFrontEnd::place(WindowId window, Shown& shown) {
 }
 
 void WebFrontEnd::showPixels(WindowId window, const Surface& picture) {
-    showInPage(number(window), picture);
+    page::showPixels(number(window), picture.width(), picture.height(), picture.row(0).data());
 }
 
 void WebFrontEnd::closeWindow(WindowId window) {

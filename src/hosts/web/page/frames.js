@@ -129,10 +129,9 @@ export class Frames {
    * @param {number} window
    * @param {number} width
    * @param {number} height
-   * @param {number} top
    * @param {Uint8Array} pixels
    */
-  show(window, width, height, top, pixels) {
+  show(window, width, height, pixels) {
     const shown = this.#windows.get(window);
     if (shown === undefined) return;
     const {canvas, paint, frame} = shown;
@@ -142,7 +141,7 @@ export class Frames {
       this.#sharpen(shown);
     }
     const bytes = new Uint8ClampedArray(/** @type {ArrayBuffer} */ (pixels.buffer), pixels.byteOffset, pixels.length);
-    paint.putImageData(new ImageData(bytes, width), 0, top);
+    paint.putImageData(new ImageData(bytes, width), 0, 0);
     if (!frame.classList.contains('seen')) {
       frame.classList.add('seen');
       (shown.field ?? canvas).focus();

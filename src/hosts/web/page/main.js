@@ -3,7 +3,7 @@
 import {Frames} from './frames.js';
 import {showHelp} from './help.js';
 import {Keeping} from './keeping.js';
-import {filesOf, isOneFile} from './parts.js';
+import {filesOf, isOneFile, program as loadProgram} from './parts.js';
 import {Program} from './program.js';
 
 const helpPage = 'QB_HELP.HTM';
@@ -51,7 +51,7 @@ function open(document) {
 }
 
 async function play() {
-  const [keeping, files] = await Promise.all([Keeping.open(), filesOf('first')]);
+  const [module, files, keeping] = await Promise.all([loadProgram(), filesOf('pictures'), Keeping.open()]);
   let isTold = false;
   /** Said once: the program itself tells of what cannot be read. @param {boolean} isKept */
   const tellIfLost = (isKept) => {
@@ -74,7 +74,7 @@ async function play() {
     if (document.hidden) keep();
   });
   addEventListener('pagehide', keep);
-  await program.start(new Frames(desk, program), seed());
+  await program.start(module, new Frames(desk, program), seed());
   program.call('setHidden', document.hidden);
   await addLargePictures(program);
 }

@@ -3,34 +3,42 @@
 /** @typedef {Map<string, Uint8Array>} Files */
 
 /** Whether everything is inside the page. */
-export const isOneFile = document.getElementById('first') !== null;
+export const isOneFile = document.getElementById('program') !== null;
 
 /**
- * The files of a pack, "first" or "rest".
+ * The program itself, compiled while it arrives.
+ * @returns {Promise<WebAssembly.Module>}
+ */
+export function program() {
+  const asModule = {headers: {'Content-Type': 'application/wasm'}};
+  return twice(async () => WebAssembly.compileStreaming(new Response(await unpacked('program'), asModule)));
+}
+
+/**
+ * The files of a pack, "pictures" or "rest".
  * @param {string} pack
  * @returns {Promise<Files>}
  */
-export async function filesOf(pack) {
-  const inside = document.getElementById(pack);
-  const packed = inside === null ? await fetched(`${pack}.data`) : new Blob([decoded(inside.textContent ?? '')]);
-  const unpacked = packed.stream().pipeThrough(new DecompressionStream('gzip'));
-  return unpack(new Uint8Array(await new Response(unpacked).arrayBuffer()));
+export function filesOf(pack) {
+  return twice(async () => unpack(await new Response(await unpacked(pack)).arrayBuffer()));
 }
 
 /**
  * A connection that fails once gets a second chance.
- * @param {string} name
- * @returns {Promise<Blob>}
+ * @template T
+ * @param {() => Promise<T>} load
+ * @returns {Promise<T>}
  */
-async function fetched(name, tries = 2) {
-  try {
-    const response = await fetch(name);
-    if (!response.ok) throw new Error(`${name}: ${response.status}`);
-    return await response.blob();
-  } catch (error) {
-    if (tries === 1) throw error;
-    return fetched(name, tries - 1);
-  }
+function twice(load) {
+  return load().catch(load);
+}
+
+/** @param {string} name */
+async function unpacked(name) {
+  const inside = document.getElementById(name);
+  const packed = inside === null ? await fetch(`${name}.data`) : new Response(decoded(inside.textContent ?? ''));
+  if (!packed.ok || packed.body === null) throw new Error(`${name}: ${packed.status}`);
+  return packed.body.pipeThrough(new DecompressionStream('gzip'));
 }
 
 /**
@@ -52,10 +60,11 @@ function decoded(text) {
 
 /**
  * A pack begins with the length of its list, four bytes, and the list, JSON: the files' names and sizes.
- * @param {Uint8Array} bytes
+ * @param {ArrayBuffer} buffer
  */
-function unpack(bytes) {
-  const listEnd = 4 + new DataView(bytes.buffer).getUint32(0, true);
+function unpack(buffer) {
+  const bytes = new Uint8Array(buffer);
+  const listEnd = 4 + new DataView(buffer).getUint32(0, true);
   /** @type {[string, number][]} */
   const list = JSON.parse(new TextDecoder().decode(bytes.subarray(4, listEnd)));
   /** @type {Files} */

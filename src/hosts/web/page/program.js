@@ -28,13 +28,12 @@ export class Program {
   }
 
   /**
+   * @param {WebAssembly.Module} module
    * @param {Frames} frames
    * @param {bigint} seed
    */
-  async start(frames, seed) {
-    const module = this.files.get('quabble.wasm') ?? new Uint8Array();
-    const {instance} = await WebAssembly.instantiate(/** @type {BufferSource} */ (module), this.#imports(frames));
-    this.files.delete('quabble.wasm');
+  async start(module, frames, seed) {
+    const instance = await WebAssembly.instantiate(module, this.#imports(frames));
     this.#exports = /** @type {any} */ (instance.exports);
     this.#exports._initialize();
     this.call('start', ...frames.room(), seed);
@@ -121,8 +120,8 @@ export class Program {
       createWindow: (window, owner, isBorderless, caption, size) =>
         frames.create(window, owner, isBorderless !== 0, this.#textAt(caption, size)),
       placeWindow: (window, ...places) => frames.place(window, places),
-      showRows: (window, width, height, top, rows, pixels) =>
-        frames.show(window, width, height, top, this.bytesAt(pixels, width * rows * 4)),
+      showPixels: (window, width, height, pixels) =>
+        frames.show(window, width, height, this.bytesAt(pixels, width * height * 4)),
       closeWindow: (window) => frames.close(window),
       minimiseWindow: (window) => frames.minimise(window),
       setPointer: (window, isHand) => frames.setPointer(window, isHand !== 0),

@@ -1,0 +1,155 @@
+// What the page costs in Chromium, against a page that shows one picture: node measure_page.mjs PAGE TOOLS SPLASH.png
+//   PAGE   the folder that the build makes the page in
+//   TOOLS  the folder with the page's tools
+import {copyFileSync, mkdtempSync, rmSync, statSync, writeFileSync} from 'node:fs';
+import {tmpdir} from 'node:os';
+import {createRequire} from 'node:module';
+import {join, resolve} from 'node:path';
+import {serve, addressOf} from '../src/hosts/web/serve.mjs';
+
+const [page, tools, splash] = process.argv.slice(2).map((path) => resolve(path));
+const puppeteer = createRequire(tools + '/')('puppeteer-core');
+const starts = Number(process.env.STARTS ?? 15);
+const browser = await puppeteer.launch({
+  executablePath: '/usr/bin/chromium', headless: true,
+  args: ['--no-sandbox', '--disable-gpu', '--disable-quic', '--no-first-run', '--disable-background-networking',
+    '--disable-component-update', '--disable-sync'],
+});
+
+const median = (values) => values.toSorted((one, other) => one - other)[values.length >> 1];
+
+/** A line of the table whose head bench/run prints. */
+function report(what, measured, limit, unit, {times = 1, more = 0} = {}) {
+  const number = (value) => `${value.toFixed(2).padStart(9)} ${unit.padEnd(6)}`;
+  const goal = times !== 1 ? `x ${times}` : `+ ${more} ${unit}`;
+  const ratio = limit > 0 ? (measured / limit).toFixed(2) : '-';
+  const isMet = measured <= limit * times + more;
+  console.log(`| ${what.padEnd(58)} | ${number(measured)} | ${number(limit)} | ${ratio.padStart(6)} | ${goal.padEnd(14)} | ${(isMet ? 'ok' : 'SHORT').padEnd(5)} |`);
+}
+
+/** A visit by a browser that has seen nothing before. */
+async function visit(address, width, height, ratio, watch) {
+  const context = await browser.createBrowserContext();
+  const tab = await context.newPage();
+  await tab.setViewport({width, height, deviceScaleFactor: ratio});
+  await tab.evaluateOnNewDocument(watch);
+  await tab.goto(address);
+  return {tab, leave: () => context.close()};
+}
+
+/** Notes the time of the first frame in which the picture is seen, and the program's memory. */
+function watchGame() {
+  const start = WebAssembly.instantiate;
+  WebAssembly.instantiate = async (...values) => {
+    const made = await start(...values);
+    window.programMemory = made.exports.memory;
+    return made;
+  };
+  new MutationObserver(() => {
+    if (!window.firstPicture && document.querySelector('.frame.seen'))
+      requestAnimationFrame(() => (window.firstPicture ??= performance.now()));
+  }).observe(document, {subtree: true, childList: true, attributes: true});
+}
+function watchPicture() {
+  addEventListener('load', () => requestAnimationFrame(() => (window.firstPicture = performance.now())));
+}
+
+async function timeOfFirstPicture(address, watch) {
+  const {tab, leave} = await visit(address, 1280, 800, 1, watch);
+  const time = await (await tab.waitForFunction(() => window.firstPicture)).jsonValue();
+  await leave();
+  return time;
+}
+
+async function untilMenu(tab) {
+  await tab.waitForFunction(() => document.querySelector('.bar')?.parentElement.classList.contains('seen'));
+  await tab.waitForFunction(() => document.querySelector('.frame canvas').style.imageRendering === 'pixelated');
+}
+
+/**
+ * Does the same many times in the tab, and gives the milliseconds of one. What a canvas puts off it does when it is read.
+ * The clock counts tenths of a millisecond.
+ */
+const timeIn = (tab, act) => tab.evaluate(async (source) => {
+  const run = new Function(`return (${source})`)();
+  const paint = document.querySelector('.frame canvas').getContext('2d');
+  const times = [];
+  for (let round = 0; round < 15; ++round) {
+    const acts = 20;
+    const begin = performance.now();
+    for (let i = 0; i < acts; ++i) {
+      run(i);
+      paint.getImageData(0, 0, 1, 1);
+    }
+    times.push((performance.now() - begin) / acts);
+  }
+  return times.toSorted((one, other) => one - other)[times.length >> 1];
+}, act.toString());
+
+/** The pointer goes from one button of the menu to another, and the whole window is shown again. */
+function hoverMenu(i) {
+  const canvas = document.querySelector('.frame canvas');
+  const area = canvas.getBoundingClientRect();
+  const y = area.top + (area.height * (i % 2 === 0 ? 67 : 119)) / 562;
+  canvas.dispatchEvent(new PointerEvent('pointermove', {clientX: area.left + area.width / 2, clientY: y, bubbles: true}));
+}
+function putPixels() {
+  const canvas = document.querySelector('.frame canvas');
+  window.pixels ??= new ImageData(canvas.width, canvas.height);
+  canvas.getContext('2d').putImageData(window.pixels, 0, 0);
+}
+
+const received = new Map();
+const site = await serve(join(page, 'site'), 0, (path, size) => received.set(path, size));
+const folder = mkdtempSync(join(tmpdir(), 'picture-'));
+copyFileSync(splash, join(folder, 'splash.png'));
+writeFileSync(join(folder, 'index.html'), '<!doctype html><title>A picture</title><img src="splash.png">');
+const picture = await serve(folder);
+
+const times = {page: [], picture: []};
+for (let i = 0; i < starts; ++i) {
+  times.page.push(await timeOfFirstPicture(addressOf(site), watchGame));
+  times.picture.push(await timeOfFirstPicture(addressOf(picture), watchPicture));
+}
+report('navigation to the first picture | a page with one PNG', median(times.page), median(times.picture), 'ms', {times: 1.5});
+
+let sizes = 0;
+for (const [path, size] of received) sizes += /rest\.data|HTM$/.test(path) ? 0 : size;
+report('a first visit, without fine pictures and help | stated', sizes / 1000, 450, 'kB');
+report('the page in one file | stated', statSync(join(page, 'quabble.html')).size / 1000, 1200, 'kB');
+
+for (const scale of [1, 2]) {
+  const {tab, leave} = await visit(addressOf(site), 700 * scale, 620 * scale, 1, watchGame);
+  await untilMenu(tab);
+  const at = scale === 1 ? '' : ` at scale ${scale}`;
+  report(`showing the main window${at} | putImageData`, await timeIn(tab, hoverMenu), await timeIn(tab, putPixels), 'ms', {times: 1.5});
+  if (scale === 1) await measurePlay(tab);
+  else report('memory of WebAssembly at scale 2 | stated', await tab.evaluate(() => window.programMemory.buffer.byteLength / (1 << 20)), 24, 'MiB');
+  await leave();
+}
+
+/** @param {any} tab */
+async function measurePlay(tab) {
+  const busy = async () => (await tab.metrics()).TaskDuration * 1000;
+  const timers = await tab.evaluate(() => {
+    window.timers = 0;
+    for (const name of ['setTimeout', 'setInterval', 'requestAnimationFrame', 'requestIdleCallback']) {
+      const ask = window[name];
+      window[name] = (...values) => (++window.timers, ask.apply(window, values));
+    }
+    return () => window.timers;
+  }).then(() => () => tab.evaluate(() => window.timers));
+  const before = await busy();
+  await new Promise((rest) => setTimeout(rest, 10000));
+  report('10 s idle, main menu: timers set | none', await timers(), 0, '');
+  const blank = await browser.newPage();
+  const idleBefore = (await blank.metrics()).TaskDuration;
+  await new Promise((rest) => setTimeout(rest, 10000));
+  const idle = ((await blank.metrics()).TaskDuration - idleBefore) * 1000;
+  await blank.close();
+  report('20 s idle, main menu: time of tasks | 10 s of a blank page', (await busy()) - before, idle, 'ms', {times: 4});
+}
+rmSync(folder, {recursive: true});
+site.close();
+picture.close();
+await browser.close();
