@@ -66,8 +66,12 @@ const site = join(out, 'site');
 mkdirSync(site, {recursive: true});
 const icon = (width) => readFileSync(join(filesFolder, `icon_${width}.png`));
 
+const siteLinks = [
+  ...['program', 'pictures'].map((name) => `<link rel="preload" href="${name}.data" as="fetch" crossorigin>`),
+  '<link rel="manifest" href="manifest.webmanifest">', '<link rel="icon" href="icon_192.png">',
+];
 const siteFiles = {
-  'index.html': fill('<link rel="manifest" href="manifest.webmanifest">\n<link rel="icon" href="icon_192.png">', '', "'self'"),
+  'index.html': fill(siteLinks.join('\n'), '', "'self'"),
   'program.data': program,
   'pictures.data': pack(pictures),
   'rest.data': pack(largePictures),

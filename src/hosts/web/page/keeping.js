@@ -17,17 +17,21 @@ function isOnlyPage() {
   });
 }
 
-/** The storage, or why nothing can be kept in it. */
+/** The storage. Nothing is written before this page has got the right to. */
 export class Keeping {
   /** What lies there, as far as we know: nobody else's is written over. */
   #known = /** @type {string | null} */ (null);
   #isRead = false;
-  isElsewhere = false;
+  #isOurs = false;
 
-  static async open() {
-    const keeping = new Keeping();
-    keeping.isElsewhere = !(await isOnlyPage());
-    return keeping;
+  /** Resolves to whether this page may keep things; if not, another one is open. */
+  async open() {
+    this.#isOurs = await isOnlyPage();
+    return this.#isOurs;
+  }
+
+  get isOurs() {
+    return this.#isOurs;
   }
 
   /** Whether it could be read when it was last asked for; if not, the program has told the player. */
@@ -50,7 +54,7 @@ export class Keeping {
   /** @param {Uint8Array} bytes */
   write(bytes) {
     try {
-      if (this.isElsewhere || localStorage.getItem(name) !== this.#known) return false;
+      if (!this.#isOurs || localStorage.getItem(name) !== this.#known) return false;
       const text = String.fromCharCode(...bytes);
       localStorage.setItem(name, text);
       this.#known = text;

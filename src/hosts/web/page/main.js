@@ -51,11 +51,13 @@ function open(document) {
 }
 
 async function play() {
-  const [module, files, keeping] = await Promise.all([loadProgram(), filesOf('pictures'), Keeping.open()]);
+  const keeping = new Keeping();
+  const isOpened = keeping.open();
+  const [module, files] = await Promise.all([loadProgram(), filesOf('pictures')]);
   let isTold = false;
   /** Said once: the program itself tells of what cannot be read. @param {boolean} isKept */
   const tellIfLost = (isKept) => {
-    if (isKept || isTold || keeping.isElsewhere || !keeping.isReadable) return;
+    if (isKept || isTold || !keeping.isOurs || !keeping.isReadable) return;
     isTold = true;
     notice.textContent = 'Settings and high scores cannot be kept: the browser refuses to store them.';
   };
@@ -66,8 +68,6 @@ async function play() {
     fail,
     open,
   });
-  if (keeping.isElsewhere)
-    notice.textContent = 'Quabble is open in another tab. Settings and high scores of this one will be lost.';
   const keep = () => tellIfLost(program.keep());
   document.addEventListener('visibilitychange', () => {
     program.call('setHidden', document.hidden);
@@ -76,6 +76,8 @@ async function play() {
   addEventListener('pagehide', keep);
   await program.start(module, new Frames(desk, program), seed());
   program.call('setHidden', document.hidden);
+  if (!(await isOpened))
+    notice.textContent = 'Quabble is open in another tab. Settings and high scores of this one will be lost.';
   await addLargePictures(program);
 }
 
