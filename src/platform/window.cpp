@@ -83,6 +83,7 @@ void Window::refresh() {
     const std::optional<Rect> ringed = ringedPlace();
     const bool covered =
         std::ranges::any_of(controls_, [](const Control* control) { return control->visible; });
+    ++loop_.picturesShown_;
     if (!covered && !ringed) {
         loop_.frontEnd().showPixels(id_, canvas_.picture());
         return;
@@ -100,6 +101,10 @@ void Window::refresh() {
 void Window::minimise() {
     if (shown_)
         loop_.frontEnd().minimiseWindow(id_);
+}
+
+Point Window::pointer() const {
+    return pixelAt(pointerX_, pointerY_);
 }
 
 Task<> Window::Form_QueryUnload() {
@@ -129,7 +134,7 @@ void Window::tellWhereTextIsTyped() {
 
 // What is below a dialog cannot be clicked.
 void Window::tellPointer() {
-    const Control* control = controlAt(pixelAt(pointerX_, pointerY_));
+    const Control* control = controlAt(pointer());
     const bool takesInput = loop_.modalWindow() == nullptr || loop_.modalWindow() == this;
     const bool isHand =
         takesInput && (control == nullptr ? isClickable(pointerX_, pointerY_) : control->isClickable());
@@ -278,7 +283,7 @@ Task<> Window::steerPointer(EditCommand command) {
     const std::optional<Rect> place = choosePlace(command);
     if (!place)
         co_return;
-    const Point at = clicks && place == ringed ? pixelAt(pointerX_, pointerY_) : middleOf(*place);
+    const Point at = clicks && place == ringed ? pointer() : middleOf(*place);
     InputEvent event{.window = id_, .x = static_cast<float>(at.x), .y = static_cast<float>(at.y)};
     Control* control = controlAt(at);
     if (control != nullptr && control->takesFocus())
@@ -298,7 +303,7 @@ std::optional<Rect> Window::choosePlace(EditCommand command) {
     const std::vector<Rect> places = placesInReach();
     const std::optional<Rect> from = focus_ == nullptr ? ringedPlace() : std::optional(focus_->area);
     if (!from) {
-        const std::optional<Rect> first = placeNearestTo(places, pixelAt(pointerX_, pointerY_));
+        const std::optional<Rect> first = placeNearestTo(places, pointer());
         if (first)
             goal_ = middleOf(*first);
         return first;
@@ -324,7 +329,7 @@ std::vector<Rect> Window::placesInReach() const {
 std::optional<Rect> Window::ringedPlace() const {
     if (!isRingShown_)
         return std::nullopt;
-    return placeAt(placesInReach(), pixelAt(pointerX_, pointerY_));
+    return placeAt(placesInReach(), pointer());
 }
 
 void Window::hideRing() {

@@ -52,6 +52,11 @@ class Window {
 
     void minimise();
 
+    Scale wantedScale() const { return wantedScale_; }
+    // Where the pointer was seen last, and whether that is shown by a ring.
+    Point pointer() const;
+    bool isRingShown() const { return isRingShown_; }
+
  protected:
     MessageLoop& loop() { return loop_; }
     void setCaption(std::string caption) { traits_.caption = std::move(caption); }  // UTF-8
