@@ -52,6 +52,15 @@ std::optional<std::size_t> ButtonPanel::buttonAt(float x, float y) const {
     return std::nullopt;
 }
 
+std::vector<Rect> ButtonPanel::places() const {
+    std::vector<Rect> places;
+    for (const ScreenButton& box : boxes_) {
+        if (box.active == BoxKind::Button)
+            places.push_back(box.rect());
+    }
+    return places;
+}
+
 bool ButtonPanel::highlightNext(Canvas& canvas, float x, float y) {
     const auto isWrong = [&](const ScreenButton& box) {
         return box.active == BoxKind::Button && box.hovered != hitTest(box, x, y);

@@ -29,6 +29,9 @@ class ButtonPanel {
     // Which button, of the buttons alone, counted from 0, is at that place.
     std::optional<std::size_t> buttonAt(float x, float y) const;
 
+    // Where its buttons are.
+    std::vector<Rect> places() const;
+
     // The next button that is not drawn as the pointer's place asks for is drawn so. False when all are.
     bool highlightNext(Canvas& canvas, float x, float y);
 

@@ -35,16 +35,32 @@ ButtonPanel& GameScreen::panel() {
     return shown_ == Shown::ClassicGame ? standardBtns_ : arcadeBtns_;
 }
 
+const ButtonPanel& GameScreen::panel() const {
+    return shown_ == Shown::ClassicGame ? standardBtns_ : arcadeBtns_;
+}
+
 std::optional<PanelButton> GameScreen::buttonAt(float x, float y) const {
-    const ButtonPanel& panel = shown_ == Shown::ClassicGame ? standardBtns_ : arcadeBtns_;
-    const auto button = panel.buttonAt(x, y);
+    const auto button = panel().buttonAt(x, y);
     return button ? std::optional(static_cast<PanelButton>(*button)) : std::nullopt;
 }
 
 bool GameScreen::isOnPreview(float x, float y) const {
-    const Rect strip{previewBox_.left, previewBox_.top, previewBox_.cell(12, 0).left,
-                     previewBox_.cell(0, 1).top};
-    return app_.game.arcadeActive && hitTest(strip, x, y);
+    return app_.game.arcadeActive && hitTest(strip(), x, y);
+}
+
+Rect GameScreen::strip() const {
+    return {previewBox_.left, previewBox_.top, previewBox_.cell(12, 0).left, previewBox_.cell(0, 1).top};
+}
+
+std::vector<Rect> GameScreen::places() const {
+    std::vector<Rect> places = panel().places();
+    for (std::int32_t row = 0; row < app_.game.grid.gridRows(); ++row) {
+        for (std::int32_t column = 0; column < app_.game.grid.gridCols(); ++column)
+            places.push_back(boardBox_.cell(column, row));
+    }
+    if (shown_ == Shown::ArcadeGame)
+        places.push_back(strip());
+    return places;
 }
 
 void GameScreen::highlightUnderPointer(float x, float y) {

@@ -41,6 +41,8 @@ class GameScreen final : public Stage {
     // Whether the place is on the strip of the waiting row, which only an arcade game has.
     bool isOnPreview(float x, float y) const;
     void highlightUnderPointer(float x, float y);
+    // The panel's buttons, the board's cells and the strip of the game that is on the screen.
+    std::vector<Rect> places() const;
 
     // Paints all that was drawn for the game that is on the screen once more, as it is outside a move.
     void paint();
@@ -71,6 +73,8 @@ class GameScreen final : public Stage {
  private:
     const Sprites& sprites() { return app_.pictures.sprites(window_.canvas().scale()); }
     ButtonPanel& panel();
+    const ButtonPanel& panel() const;
+    Rect strip() const;
     BoardArea layOutOn(const Rect& playPanel);
     void clear();
     void drawPanel();

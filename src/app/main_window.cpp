@@ -91,6 +91,10 @@ bool MainWindow::isClickable(float x, float y) const {
     return app_.game.isGameActive() && (screen_.buttonAt(x, y) || screen_.isOnPreview(x, y));
 }
 
+std::vector<Rect> MainWindow::places() const {
+    return app_.game.mainMenuActive ? mmBtns_.places() : screen_.places();
+}
+
 Task<> MainWindow::Form_MouseDown(float x, float y) {
     if (isPaused())
         enablePause(false);

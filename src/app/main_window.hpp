@@ -35,6 +35,7 @@ class MainWindow final : public Window {
     Task<> Form_KeyPress(std::int16_t key) override;
     int screen() const override;
     bool isClickable(float x, float y) const override;
+    std::vector<Rect> places() const override;
     Task<> mainMenuClick(float x, float y);
     Task<> gameClick(float x, float y);
     Task<> gameMenuClick(PanelButton button);

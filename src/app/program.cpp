@@ -6,7 +6,23 @@
 namespace quabble {
 
 Program::Program(FrontEnd& frontEnd, RegistryStore& registry, std::uint64_t seed)
-    : loop_(frontEnd), state_(frontEnd, registry, seed), task_(run()) {}
+    : frontEnd_(frontEnd), seed_(seed), loop_(frontEnd), state_(frontEnd, registry, seed), task_(run()) {}
+
+void Program::start() {
+    task_.start();
+    beginRecord(false);
+}
+
+void Program::post(const InputEvent& event) {
+    record(event);
+    loop_.post(event);
+}
+
+void Program::wake() {
+    if (loop_.isTimeUp())
+        recorder_.addWake(frontEnd_.now());
+    loop_.wake();
+}
 
 Task<> Program::run() {
     co_await Main();
@@ -38,6 +54,43 @@ bool Program::requestEnd() {
     const bool isKept = keep();
     loop_.end();
     return isKept;
+}
+
+// A record begins anew with whatever is done at the menu while nothing else goes on: so it has the last game,
+// whichever it is, from the click that began it.
+void Program::record(const InputEvent& event) {
+    if (state_.game.mainMenuActive && frmQuabble_ && loop_.modalWindow() == nullptr && loop_.isIdle())
+        beginRecord(true);
+    const Window* topmost = loop_.modalWindow();
+    if (topmost == nullptr)
+        topmost = frmQuabble_.get();
+    const bool isTopmost = topmost != nullptr && event.window == topmost->id();
+    const bool isBelow = !isTopmost && frmQuabble_ && event.window == frmQuabble_->id();
+    if (isTopmost || isBelow)
+        recorder_.add(event, isBelow, frontEnd_.now(), loop_.picturesShown());
+}
+
+void Program::beginRecord(bool isAtMenu) {
+    Recorder::Start start;
+    start.seed = seed_;
+    start.drawn = state_.random.drawn();
+    start.isAtMenu = isAtMenu;
+    for (std::int16_t table = 1; table <= highScoreTables; ++table)
+        start.scores[static_cast<std::size_t>(table - 1)] = state_.highScores.table(table).scores;
+    if (isAtMenu) {
+        start.pointer = frmQuabble_->pointer();
+        start.isRingShown = frmQuabble_->isRingShown();
+    }
+    const Window* window = isAtMenu ? frmQuabble_.get() : loop_.modalWindow();
+    if (window != nullptr)
+        start.scale = window->wantedScale();
+    recorder_.begin(start, frontEnd_.now());
+}
+
+void Program::writeVisit(const Recorder::Output& output) const {
+    const GameState& game = state_.game;
+    const bool hasRows = game.gameMode != GameMode::Training;
+    recorder_.write({game.stats.score, game.stats.level, hasRows ? game.rowsEntered : 0}, output);
 }
 
 }  // namespace quabble

@@ -9,6 +9,7 @@
 #include "base/task.hpp"
 #include "platform/message_loop.hpp"
 #include "registry/registry_store.hpp"
+#include "visits/recorder.hpp"
 
 namespace quabble {
 
@@ -21,15 +22,15 @@ class Program {
     Program(FrontEnd& frontEnd, RegistryStore& registry, std::uint64_t seed);
 
     // Runs the program up to its first wait. To be called once, before anything else.
-    void start() { task_.start(); }
+    void start();
 
     // Something happened to a window. Nothing comes of it before the program is woken, so that this may be
     // called at any time, also from inside a call of the front end.
-    void post(const InputEvent& event) { loop_.post(event); }
+    void post(const InputEvent& event);
 
     // The program goes on until it has to wait again. Without an event and before the next deadline it does
     // nothing, and neither does it inside a call of the front end.
-    void wake() { loop_.wake(); }
+    void wake();
 
     // When to wake it at the latest, if nothing happens before; it may lie in the past. Nothing when it waits
     // for the user alone.
@@ -50,6 +51,11 @@ class Program {
     // From then on the program does nothing. The user ends it by closing the main window.
     bool ended() const { return loop_.ended(); }
 
+    // Writes a visit (docs/visits.md) that does again what was done since the last game began or, before the
+    // first, since the start. It asks for no memory, and a line at a time is given to the output. Typed texts
+    // are not in it.
+    void writeVisit(const Recorder::Output& output) const;
+
     // What tests, benchmarks and screenshots look at. The main window is there once the splash has closed.
     AppState& state() { return state_; }
     MainWindow& frmQuabble() { return *frmQuabble_; }
@@ -57,8 +63,13 @@ class Program {
  private:
     Task<> run();
     Task<> Main();
+    void beginRecord(bool isAtMenu);
+    void record(const InputEvent& event);
 
+    FrontEnd& frontEnd_;
+    std::uint64_t seed_;
     MessageLoop loop_;
+    Recorder recorder_;
     AppState state_;
     std::unique_ptr<MainWindow> frmQuabble_;
     Task<> task_;

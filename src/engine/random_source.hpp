@@ -17,10 +17,21 @@ class RandomSource {
 class SeededRandom final : public RandomSource {
  public:
     explicit SeededRandom(std::uint64_t seed) : generator_(seed) {}
-    double next() override { return static_cast<double>(generator_() >> 11) * 0x1.0p-53; }
+    double next() override {
+        ++drawn_;
+        return static_cast<double>(generator_() >> 11) * 0x1.0p-53;
+    }
+
+    // How many numbers it has given, and going on behind so many more.
+    std::uint64_t drawn() const { return drawn_; }
+    void skip(std::uint64_t numbers) {
+        generator_.discard(numbers);
+        drawn_ += numbers;
+    }
 
  private:
     std::mt19937_64 generator_;
+    std::uint64_t drawn_ = 0;
 };
 
 }  // namespace quabble

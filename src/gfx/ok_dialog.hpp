@@ -17,6 +17,7 @@ class OkDialog : public Window {
 
  private:
     bool isClickable(float x, float y) const override { return hitTest(okBox_, x, y); }
+    std::vector<Rect> places() const override { return {okBox_.rect()}; }
     Task<> Form_MouseDown(float x, float y) override;
     Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;

@@ -29,10 +29,14 @@ constexpr std::int16_t escape = 27;
 constexpr std::int16_t space = 32;
 }  // namespace keys
 
-// What a key asks of a text that is being edited.
+// What a key asks of a text that is being edited, or of the program's own pointer: Up, Down and Click, and
+// Left and Right where no text is.
 enum class EditCommand {
     Left,
     Right,
+    Up,
+    Down,
+    Click,
     WordLeft,
     WordRight,
     Home,
@@ -57,9 +61,10 @@ struct InputEvent {
     // Of a key press: the character that the key yields. A press is reported once, not again while the key is
     // held; arrows, function keys, modifiers and keys pressed together with Ctrl or Alt yield none.
     std::int16_t key = 0;
-    EditCommand command = EditCommand::Left;  // of an edit, which is reported again while its keys are held
-    bool extends = false;                     // of an edit or a mouse press: Shift is held
-    std::string text = {};                    // of a text input, UTF-8
+    // Of an edit, which is reported again while its keys are held, but for a click.
+    EditCommand command = EditCommand::Left;
+    bool extends = false;         // of an edit or a mouse press: Shift is held
+    std::string text = {};        // of a text input, UTF-8
     bool continuesClick = false;  // of a mouse press: it follows another quickly, as in a double click
     Scale scale = {};             // of the pictures that a rescaled window wants from now on
 };

@@ -86,6 +86,12 @@ std::optional<TimePoint> MessageLoop::nextDeadline() const {
     return earliest == Timer::never ? std::nullopt : std::optional(earliest);
 }
 
+bool MessageLoop::isTimeUp() const {
+    if (ended_ || !program_)
+        return false;
+    return programWaitsUntil_ ? isOver(programWaitsUntil_) : firstDueTimer() != nullptr;
+}
+
 bool MessageLoop::isOver(std::optional<TimePoint> wait) const {
     if (ended_)
         return false;

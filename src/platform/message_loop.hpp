@@ -62,6 +62,13 @@ class MessageLoop {
 
     bool ended() const { return ended_; }
 
+    // Whether it waits for a message and has none.
+    bool isIdle() const { return program_ && !programWaitsUntil_ && !hasMessage(); }
+    // Whether it has something to do even if nothing has happened.
+    bool isTimeUp() const;
+    // How many pictures the windows have shown.
+    std::uint64_t picturesShown() const { return picturesShown_; }
+
     // The window that input goes to: the innermost modal one, or nothing when every window takes input.
     Window* modalWindow() const { return modalWindows_.empty() ? nullptr : modalWindows_.back(); }
 
@@ -119,6 +126,7 @@ class MessageLoop {
     std::coroutine_handle<> program_;
     std::optional<TimePoint> programWaitsUntil_;
     std::uint32_t lastWindowId_ = 0;
+    std::uint64_t picturesShown_ = 0;
     bool isAwake_ = false;  // the program is being carried on
     bool ended_ = false;
 };

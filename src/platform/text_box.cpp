@@ -108,6 +108,10 @@ void TextBox::edit(EditCommand command, bool extends) {
         case EditCommand::Paste:
             replaceSelection(windows1252Of(frontEnd_.clipboardText()));
             break;
+        case EditCommand::Up:
+        case EditCommand::Down:
+        case EditCommand::Click:
+            break;
     }
 }
 

@@ -6,6 +6,8 @@
 #include <ranges>
 #include <utility>
 
+#include "platform/places.hpp"
+
 namespace quabble {
 namespace {
 
@@ -20,6 +22,13 @@ class HandlerCount {
  private:
     int& running_;
 };
+
+Point pixelAt(float x, float y) {
+    return {static_cast<std::int32_t>(std::floor(x)), static_cast<std::int32_t>(std::floor(y))};
+}
+Point pixelOf(const InputEvent& event) {
+    return pixelAt(event.x, event.y);
+}
 
 }  // namespace
 
@@ -44,6 +53,8 @@ void Window::show() {
     focus_ = nullptr;
     pressed_ = nullptr;
     pointerX_ = pointerY_ = -1;
+    mouse_ = {-1, -1};
+    isRingShown_ = false;
     pointer_ = PointerShape::Arrow;
     id_ = static_cast<WindowId>(++loop_.lastWindowId_);
     Form_Load();
@@ -69,9 +80,11 @@ void Window::refresh() {
     if (!shown_)
         return;
     tellPointer();
+    const std::optional<Rect> ringed = ringedPlace();
     const bool covered =
         std::ranges::any_of(controls_, [](const Control* control) { return control->visible; });
-    if (!covered) {
+    ++loop_.picturesShown_;
+    if (!covered && !ringed) {
         loop_.frontEnd().showPixels(id_, canvas_.picture());
         return;
     }
@@ -80,12 +93,18 @@ void Window::refresh() {
         if (control->visible)
             control->paint(composed_, control == focus_);
     }
+    if (ringed)
+        paintPointerRing(composed_, *ringed);
     loop_.frontEnd().showPixels(id_, composed_.picture());
 }
 
 void Window::minimise() {
     if (shown_)
         loop_.frontEnd().minimiseWindow(id_);
+}
+
+Point Window::pointer() const {
+    return pixelAt(pointerX_, pointerY_);
 }
 
 Task<> Window::Form_QueryUnload() {
@@ -115,9 +134,7 @@ void Window::tellWhereTextIsTyped() {
 
 // What is below a dialog cannot be clicked.
 void Window::tellPointer() {
-    const Point at{static_cast<std::int32_t>(std::floor(pointerX_)),
-                   static_cast<std::int32_t>(std::floor(pointerY_))};
-    const Control* control = controlAt(at);
+    const Control* control = controlAt(pointer());
     const bool takesInput = loop_.modalWindow() == nullptr || loop_.modalWindow() == this;
     const bool isHand =
         takesInput && (control == nullptr ? isClickable(pointerX_, pointerY_) : control->isClickable());
@@ -128,36 +145,32 @@ void Window::tellPointer() {
 
 Task<> Window::handle(InputEvent event) {
     const HandlerCount count(handlersRunning_);
-    const Point at{static_cast<std::int32_t>(std::floor(event.x)),
-                   static_cast<std::int32_t>(std::floor(event.y))};
     switch (event.kind) {
         case EventKind::MouseDown:
-            if (Control* control = controlAt(at))
-                co_await pressControl(*control, event);
-            else
-                co_await Form_MouseDown(event.x, event.y);
+            hideRing();
+            co_await pressMouse(event);
             break;
         case EventKind::MouseMove:
-            pointerX_ = event.x;
-            pointerY_ = event.y;
-            tellPointer();
-            if (pressed_ != nullptr)
-                dragControl(at);
-            else if (controlAt(at) == nullptr)
-                co_await Form_MouseMove(event.x, event.y);
+            // Desktops also tell where the mouse is when something below it has changed.
+            if (pixelOf(event) == std::exchange(mouse_, pixelOf(event)) && isRingShown_)
+                break;
+            hideRing();
+            co_await moveMouse(event);
             break;
         case EventKind::MouseUp:
-            if (Control* control = std::exchange(pressed_, nullptr)) {
-                co_await control->mouseUp(at);
-                refresh();
-            }
+            co_await releaseMouse(event);
             break;
         case EventKind::KeyPress:
             co_await pressKey(event.key);
             break;
         case EventKind::TextInput:
-        case EventKind::Edit:
             editText(event);
+            break;
+        case EventKind::Edit:
+            if (isForPointer(event.command))
+                co_await steerPointer(event.command);
+            else
+                editText(event);
             break;
         case EventKind::CloseButton:
             co_await Form_QueryUnload();
@@ -174,14 +187,36 @@ Task<> Window::handle(InputEvent event) {
     }
 }
 
+Task<> Window::pressMouse(InputEvent event) {
+    if (Control* control = controlAt(pixelOf(event)))
+        co_await pressControl(*control, event);
+    else
+        co_await Form_MouseDown(event.x, event.y);
+}
+
+Task<> Window::moveMouse(InputEvent event) {
+    pointerX_ = event.x;
+    pointerY_ = event.y;
+    tellPointer();
+    if (pressed_ != nullptr)
+        dragControl(pixelOf(event));
+    else if (controlAt(pixelOf(event)) == nullptr)
+        co_await Form_MouseMove(event.x, event.y);
+}
+
+Task<> Window::releaseMouse(InputEvent event) {
+    if (Control* control = std::exchange(pressed_, nullptr)) {
+        co_await control->mouseUp(pixelOf(event));
+        refresh();
+    }
+}
+
 Task<> Window::pressControl(Control& control, InputEvent event) {
     if (control.takesFocus()) {
         pressed_ = &control;
         setFocus(&control);
     }
-    const Point at{static_cast<std::int32_t>(std::floor(event.x)),
-                   static_cast<std::int32_t>(std::floor(event.y))};
-    co_await control.mouseDown(at, event.extends);
+    co_await control.mouseDown(pixelOf(event), event.extends);
     refresh();
 }
 
@@ -192,6 +227,7 @@ void Window::dragControl(Point at) {
 
 Task<> Window::pressKey(std::int16_t key) {
     if (focus_ != nullptr && key == keys::tab) {
+        isRingShown_ = false;
         focusNext();
         refresh();
     } else if (focus_ != nullptr && focus_->takesText() && key == keys::backspace) {
@@ -221,6 +257,84 @@ void Window::focusNext() {
     if (next == controls_.end())
         next = std::ranges::find_if(controls_, takesFocus);
     setFocus(*next);
+}
+
+bool Window::isForPointer(EditCommand command) const {
+    switch (command) {
+        case EditCommand::Up:
+        case EditCommand::Down:
+        case EditCommand::Click:
+            return true;
+        case EditCommand::Left:
+        case EditCommand::Right:
+            return focus_ == nullptr || !focus_->takesText();
+        default:
+            return false;
+    }
+}
+
+// The keys move the pointer and click as the mouse does; the focus goes with the pointer. A click leaves it
+// where it is, so that it is there again when a notice that covered everything has gone.
+Task<> Window::steerPointer(EditCommand command) {
+    if (state_ == State::Minimised)
+        co_return;
+    const std::optional<Rect> ringed = ringedPlace();
+    const bool clicks = command == EditCommand::Click && (focus_ != nullptr || ringed);
+    const std::optional<Rect> place = choosePlace(command);
+    if (!place)
+        co_return;
+    const Point at = clicks && place == ringed ? pointer() : middleOf(*place);
+    InputEvent event{.window = id_, .x = static_cast<float>(at.x), .y = static_cast<float>(at.y)};
+    Control* control = controlAt(at);
+    if (control != nullptr && control->takesFocus())
+        setFocus(control);
+    isRingShown_ = true;
+    co_await moveMouse(event);
+    refresh();
+    if (!clicks)
+        co_return;
+    co_await pressMouse(event);
+    if (shown_ && id_ == event.window)
+        co_await releaseMouse(event);
+}
+
+// Where a key brings the pointer. Without a place that is seen to have it, it first comes to the nearest one.
+std::optional<Rect> Window::choosePlace(EditCommand command) {
+    const std::vector<Rect> places = placesInReach();
+    const std::optional<Rect> from = focus_ == nullptr ? ringedPlace() : std::optional(focus_->area);
+    if (!from) {
+        const std::optional<Rect> first = placeNearestTo(places, pointer());
+        if (first)
+            goal_ = middleOf(*first);
+        return first;
+    }
+    const bool isSideways = command == EditCommand::Left || command == EditCommand::Right;
+    const std::optional<Rect> next =
+        command == EditCommand::Click ? from : placeBeside(places, *from, command, goal_);
+    if (next)
+        (isSideways ? goal_.x : goal_.y) = isSideways ? middleOf(*next).x : middleOf(*next).y;
+    return next ? next : from;
+}
+
+std::vector<Rect> Window::placesInReach() const {
+    std::vector<Rect> reached = places();
+    std::erase_if(reached, [&](const Rect& place) { return controlAt(middleOf(place)) != nullptr; });
+    for (const Control* control : controls_) {
+        if (control->visible)
+            reached.push_back(control->area);
+    }
+    return reached;
+}
+
+std::optional<Rect> Window::ringedPlace() const {
+    if (!isRingShown_)
+        return std::nullopt;
+    return placeAt(placesInReach(), pointer());
+}
+
+void Window::hideRing() {
+    if (std::exchange(isRingShown_, false))
+        refresh();
 }
 
 void Window::paintAtWantedScale() {

@@ -52,6 +52,11 @@ class Window {
 
     void minimise();
 
+    Scale wantedScale() const { return wantedScale_; }
+    // Where the pointer was seen last, and whether that is shown by a ring.
+    Point pointer() const;
+    bool isRingShown() const { return isRingShown_; }
+
  protected:
     MessageLoop& loop() { return loop_; }
     void setCaption(std::string caption) { traits_.caption = std::move(caption); }  // UTF-8
@@ -69,6 +74,8 @@ class Window {
     virtual int screen() const { return 0; }
     // Whether the picture has something there that is to be clicked: the pointer is a hand above it.
     virtual bool isClickable(float /*x*/, float /*y*/) const { return false; }
+    // The areas of the picture that the arrow keys go to; a click in the middle of each must mean something.
+    virtual std::vector<Rect> places() const { return {}; }
     virtual void Form_Load() {}
     // Paints all that is to be seen, as the window's state has it, on a canvas that is new: when it is shown,
     // and when its scale has changed.
@@ -88,11 +95,20 @@ class Window {
     void changeState(State state);
     void paintAtWantedScale();
     Control* controlAt(Point at) const;
+    Task<> pressMouse(InputEvent event);
+    Task<> moveMouse(InputEvent event);
+    Task<> releaseMouse(InputEvent event);
     Task<> pressControl(Control& control, InputEvent event);
     Task<> pressKey(std::int16_t key);
     void dragControl(Point at);
     void editText(const InputEvent& event);
     void focusNext();
+    bool isForPointer(EditCommand command) const;
+    Task<> steerPointer(EditCommand command);
+    std::optional<Rect> choosePlace(EditCommand command);
+    std::vector<Rect> placesInReach() const;
+    std::optional<Rect> ringedPlace() const;
+    void hideRing();
     void tellWhereTextIsTyped();
     void tellPointer();
 
@@ -109,6 +125,9 @@ class Window {
     Control* pressed_ = nullptr;  // the control on which the mouse button went down
     float pointerX_ = -1;         // where the pointer was seen last
     float pointerY_ = -1;
+    Point mouse_{-1, -1};       // where the mouse itself was seen last
+    bool isRingShown_ = false;  // the arrow keys have moved the pointer last
+    Point goal_;                // of their steps
     PointerShape pointer_ = PointerShape::Arrow;
     int handlersRunning_ = 0;
     bool shown_ = false;

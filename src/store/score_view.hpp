@@ -23,6 +23,7 @@ class ScoreView final : public Window {
     bool isClickable(float x, float y) const override {
         return hitTest(buttons_[0], x, y) || hitTest(buttons_[1], x, y);
     }
+    std::vector<Rect> places() const override { return {buttons_[0].rect(), buttons_[1].rect()}; }
     Task<> Form_MouseDown(float x, float y) override;
     Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;

@@ -3,7 +3,7 @@
 #include <set>
 
 #include "../engine/board_notation.hpp"
-#include "../support/bitmap.hpp"
+#include "draw/bitmap_file.hpp"
 #include "app/program.hpp"
 #include "gfx/painters.hpp"
 #include "hosts/headless/memory_blob.hpp"
@@ -34,7 +34,7 @@ inline HeadlessFrontEnd::Files makeProgramFiles() {
     picture.fill(Rect::ofSize(0, 28, 28, 28), maskColour);
     picture.fill(Rect::ofSize(274, 29, 30, 241), fullGaugeColour);
     picture.fill(Rect::ofSize(0, 338, 400, 500), {90, 10, 130});
-    return {{"ALLPICDATA.BMP", bitmapOf(picture)}};
+    return {{"ALLPICDATA.BMP", encodeBitmap(picture)}};
 }
 inline const HeadlessFrontEnd::Files programFiles = makeProgramFiles();
 

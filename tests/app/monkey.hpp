@@ -46,6 +46,8 @@ class Monkey {
             clickButton();
         else if (choice < 500)
             machine_->user.click(static_cast<float>(upTo(700)), static_cast<float>(upTo(600)));
+        else if (choice < 530)
+            walk();
         else if (choice < 600)
             machine_->user.movePointer(static_cast<float>(upTo(240)), static_cast<float>(upTo(562)));
         else if (choice < 640)
@@ -69,6 +71,22 @@ class Monkey {
             machine_->clickMenu(1 + upTo(3));
         else
             machine_->clickPanel(6 + upTo(5));
+    }
+
+    void walk() {
+        constexpr EditCommand arrows[] = {EditCommand::Left, EditCommand::Right, EditCommand::Up,
+                                          EditCommand::Down};
+        for (int i = upTo(20); i >= 0; --i)
+            machine_->user.edit(arrows[upTo(4)]);
+        machine_->user.edit(EditCommand::Click);
+        hasWalked_ = true;
+    }
+
+    // The ring goes; the mouse comes to another place each time.
+    void takeMouse() {
+        mouseX_ = mouseX_ == 0 ? 1 : 0;
+        machine_->user.movePointer(mouseX_, 0);
+        hasWalked_ = false;
     }
 
     // Goes near the end of the level, on a board with something of everything.
@@ -112,6 +130,8 @@ class Monkey {
         EXPECT_FALSE(game.boolProcessing);
         if (paused)
             return;
+        if (hasWalked_)
+            takeMouse();
         if (game.mainMenuActive)
             checkMenu();
         else
@@ -147,6 +167,8 @@ class Monkey {
     std::unique_ptr<Machine> machine_;
     std::size_t gamesEnded_ = 0;
     std::set<WindowId> results_;
+    bool hasWalked_ = false;
+    float mouseX_ = 0;
 };
 
 }  // namespace quabble

@@ -3,6 +3,7 @@
 #include <bitset>
 #include <map>
 #include <ranges>
+#include <set>
 #include <string>
 
 #include "../support/files.hpp"
@@ -11,6 +12,8 @@
 #include "draw/fingerprint.hpp"
 #include "draw/large_picture.hpp"
 #include "draw/scaling.hpp"
+#include "gfx/palette.hpp"
+#include "platform/places.hpp"
 
 namespace quabble {
 namespace {
@@ -171,6 +174,47 @@ TEST_F(Art, BlocksStandOutFromThePanel) {
         const LinearColour body = mean(number, partWithin({2, 2, 26, 26}) & ~figure(number), whole_);
         EXPECT_GE(contrast(body, panel), leastContrast) << number << " and the panel";
         EXPECT_GE(contrast(body, mean(0, whole_, whole_)), leastContrast) << number << " and an empty cell";
+    }
+}
+
+// Of its two colours one is enough anywhere, and they stand out from one another, so that the ring is seen
+// whatever it lies on.
+TEST_F(Art, TheRingOfThePointerStandsOutFromEverythingForEverySight) {
+    const Rect cell = Rect::ofSize(10, 10, 28, 28);
+    std::vector<Colour> lines;  // across the ring, from the outside
+    for (const int quarters : {4, 5, 6, 7, 8, 10, 12, 16}) {
+        const Scale scale = Scale::ofQuarters(quarters);
+        Canvas canvas({48, 48}, scale);
+        canvas.fill(canvas.bounds(), {90, 90, 90});
+        paintPointerRing(canvas, cell);
+        lines.clear();
+        for (std::int32_t x = scale.edge(cell.left) - scale.line(); x < scale.edge(cell.left + 4);
+             x += scale.line())
+            lines.push_back(canvas.picture().at(x, canvas.picture().height() / 2));
+        ASSERT_GE(lines.size(), 4U);
+        EXPECT_EQ(lines[0], lines[3]) << quarters;
+        EXPECT_EQ(lines[1], lines[2]) << quarters;
+        EXPECT_NE(lines[0], lines[1]) << quarters;
+    }
+    std::set<std::uint32_t> beside;
+    for (std::int32_t y = 0; y < sheet_.height(); ++y)
+        beside.insert(sheet_.row(y).begin(), sheet_.row(y).end());
+    for (int tile = 0; tile < 14; ++tile) {
+        for (std::int32_t i = 0; i < 28 * 28; ++i)
+            beside.insert(pixelOf(sheet_.at(28 * tile + i % 28, i / 28)) &
+                          pixelOf(sheet_.at(i % 28, 28 + i / 28)));
+    }
+    for (const Colour plain : {palette::backgroundColour, palette::black, palette::pauseBackground})
+        beside.insert(pixelOf(plain));
+    for (const Sight& sight : sights) {
+        const auto seen = [&](Colour colour) { return sight(linearOf(colour)); };
+        const LinearColour dark = seen(lines[0]), bright = seen(lines[1]);
+        EXPECT_GE(contrast(dark, bright), leastContrast) << sight.name;
+        for (const std::uint32_t pixel : beside) {
+            const LinearColour other = seen(colourOf(pixel));
+            EXPECT_GE(std::max(contrast(dark, other), contrast(bright, other)), leastContrast)
+                << sight.name << ", " << pixel;
+        }
     }
 }
 

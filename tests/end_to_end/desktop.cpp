@@ -142,6 +142,14 @@ void Desktop::press(KeySym keysym, std::chrono::milliseconds howLong) {
     XSync(display_, False);
 }
 
+void Desktop::pressWithControl(KeySym keysym) {
+    const KeyCode control = XKeysymToKeycode(display_, XK_Control_L);
+    XTestFakeKeyEvent(display_, control, True, CurrentTime);
+    press(keysym);
+    XTestFakeKeyEvent(display_, control, False, CurrentTime);
+    XSync(display_, False);
+}
+
 void Desktop::type(const std::string& lowerCaseLetters) {
     for (const char letter : lowerCaseLetters)
         press(static_cast<unsigned char>(letter));  // a letter's keysym is its character

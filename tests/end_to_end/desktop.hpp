@@ -36,6 +36,7 @@ class Desktop {
     // As at the beginning of a drop, of a kind of thing that has no name.
     void offerUnknownDrop(WindowOnScreen window);
     void press(unsigned long keysym, std::chrono::milliseconds howLong = {});
+    void pressWithControl(unsigned long keysym);
 
     void minimise(WindowOnScreen window);
     // As a task bar does; comes back when the window is seen.

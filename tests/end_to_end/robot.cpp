@@ -1,5 +1,6 @@
-// Plays the real program in a real window: robot PROGRAM. It reads the board from the screen, clicks with a
-// real pointer, keeps its own count of the score and compares the panel and the result dialog with it.
+// Plays the real program in a real window: robot mouse|keys PROGRAM. It reads the board from the screen,
+// clicks with a real pointer or with keys alone, keeps its own count of the score and compares the panel and
+// the result dialog with it.
 
 #include <X11/keysym.h>
 
@@ -26,7 +27,8 @@ constexpr const char* playerName = "robot";
 
 class Robot {
  public:
-    explicit Robot(std::string program) : game_(desktop_, std::move(program)) {}
+    // Without a mouse it plays with the arrow keys and those that click.
+    Robot(std::string program, bool hasMouse) : game_(desktop_, std::move(program)), hasMouse_(hasMouse) {}
 
     void setScale(Scale scale) { desktop_.setScale(scale); }
     // Lets the program keep its scores elsewhere from now on.
@@ -39,7 +41,7 @@ class Robot {
     // Plays one game and leaves it at `moves` moves, or when it has ended by itself.
     void play(GameMode mode, int moves) {
         score_ = blocks_ = largest_ = 0;
-        game_.begin(mode);
+        begin(mode);
         const bool training = mode == GameMode::Training;
         int made = 0;
         for (; made < moves; ++made) {
@@ -48,16 +50,17 @@ class Robot {
             const auto [place, size] = choose(model::read(settledBoard()));
             if (hasEnded() || size < (training ? 2 : 3))
                 break;
-            const Rect cell = game_.cellAt(place.first - 1, place.second - 1);
-            desktop_.click(game_.window(), cell.left + 14, cell.top + 14);
+            clickCell(place);
             score_ += size * (size + 1) / 2;
             blocks_ += size;
             largest_ = std::max(largest_, size);
             waitUntil("the score " + std::to_string(score_) + " on the panel",
                       [this] { return showsScore(); });
+            if (!hasMouse_)
+                leaveBoard();
         }
         if (!hasEnded())
-            game_.clickEndGame();
+            clickEndGame();
         checkResult(mode);
         enterName();
         checkBestEntry();
@@ -71,11 +74,97 @@ class Robot {
     }
 
     void closeAndCheckExit() {
-        desktop_.clickCloseButton(game_.window());
+        if (hasMouse_)
+            desktop_.clickCloseButton(game_.window());
+        else
+            chooseByKeys(8);
         game_.waitForExit();
     }
 
  private:
+    void begin(GameMode mode) {
+        if (hasMouse_) {
+            game_.begin(mode);
+            return;
+        }
+        chooseByKeys(static_cast<int>(mode));
+        leaveBoard();
+        game_.waitForBoard(mode);
+    }
+
+    void clickCell(model::Place place) {
+        const Rect cell = game_.cellAt(place.first - 1, place.second - 1);
+        if (hasMouse_) {
+            desktop_.click(game_.window(), cell.left + 14, cell.top + 14);
+            return;
+        }
+        desktop_.press(XK_Right);
+        waitUntil("the ring on the board", [&] { return ring(game_.window()).left > panelRight; });
+        const int rows = (cell.top - ring(game_.window()).top) / cell.height();
+        pressTimes(rows > 0 ? XK_Down : XK_Up, std::abs(rows));
+        pressTimes(XK_Right, place.first - 1);
+        desktop_.press(XK_Insert);
+    }
+
+    void clickEndGame() {
+        if (hasMouse_) {
+            game_.clickEndGame();
+            return;
+        }
+        pressTimes(XK_Down, 2);
+        desktop_.press(XK_Menu);
+    }
+
+    void closeDialog(WindowOnScreen dialog) {
+        desktop_.waitForFocus(dialog);
+        if (hasMouse_) {
+            desktop_.press(XK_Return);
+            return;
+        }
+        pressTimes(XK_Down, 2);  // the first only shows the ring
+        pressTimes(XK_Left, 2);
+        waitUntil("the ring on a button", [&] { return ring(dialog).top > 0; });
+        desktop_.pressWithControl(XK_Return);
+    }
+
+    // From the place where the ring is, or comes with the first key.
+    void chooseByKeys(int button) {
+        desktop_.waitForFocus(game_.window());
+        pressTimes(XK_Up, 9);
+        pressTimes(XK_Down, button - 1);
+        desktop_.press(XK_Menu);
+    }
+
+    // To the panel, where the ring covers no part of the board.
+    void leaveBoard() {
+        pressTimes(XK_Left, 12);
+        waitUntil("the ring on the panel",
+                  [&] { return hasEnded() || ring(game_.window()).right <= panelRight; });
+    }
+
+    void pressTimes(unsigned long keysym, int times) {
+        for (int i = 0; i < times; ++i)
+            desktop_.press(keysym);
+    }
+
+    // What the pointer's ring is seen around, at scale 1: its upper and lower edges are the only long white
+    // lines.
+    Rect ring(WindowOnScreen window) {
+        const Surface seen = desktop_.look(window);
+        const std::vector<std::uint32_t> line(10, 0xFFFFFF);
+        Rect ring{seen.width(), seen.height(), 0, 0};
+        for (std::int32_t y = 0; y < seen.height(); ++y) {
+            const auto row = seen.row(y);
+            const auto first = std::ranges::search(row, line).begin();
+            if (first == row.end())
+                continue;
+            const auto end = std::find_if(first, row.end(), [](auto pixel) { return pixel != 0xFFFFFF; });
+            ring = {static_cast<std::int32_t>(first - row.begin()), std::min(ring.top, y),
+                    static_cast<std::int32_t>(end - row.begin()), y + 1};
+        }
+        return ring.isEmpty() ? Rect() : ring;
+    }
+
     bool hasEnded() { return desktop_.hasWindow("Game Statistics"); }
 
     // The letters of the board as soon as it has stopped changing and every cell can be read, or as they are
@@ -131,15 +220,15 @@ class Robot {
                                 .font = {Typeface::Sans, 12}};
         drawShadowText(expected, text, 2, resultText(counted, false), text_format::centre);
         waitUntil("the result as counted", [&] { return isSeen(dialog, expected, text.rect()); });
-        desktop_.waitForFocus(dialog);
-        desktop_.press(XK_Return);
+        closeDialog(dialog);
         waitUntil("the dialog's end", [this] { return !hasEnded(); });
     }
 
     void enterName() {
-        desktop_.waitForFocus(desktop_.waitForWindow("Best Score"));
+        const WindowOnScreen dialog = desktop_.waitForWindow("Best Score");
+        desktop_.waitForFocus(dialog);
         desktop_.type(playerName);
-        desktop_.press(XK_Return);
+        closeDialog(dialog);
     }
 
     void checkBestEntry() {
@@ -156,13 +245,15 @@ class Robot {
         box.left = 360;
         drawShadowText(expected, box, 1, std::to_string(score_), defaultTextFormat);
         waitUntil("the best score and its name", [&] { return isSeen(view, expected, {45, 45, 450, 90}); });
-        desktop_.waitForFocus(view);
-        desktop_.press(XK_Return);
+        closeDialog(view);
         waitUntil("the view's end", [this] { return !desktop_.hasWindow("Best Scores - Quabble"); });
     }
 
+    static constexpr int panelRight = 200;
+
     Desktop desktop_;
     RunningGame game_;
+    bool hasMouse_;
     int score_ = 0;
     int blocks_ = 0;
     int largest_ = 0;
@@ -171,9 +262,9 @@ class Robot {
 }  // namespace
 }  // namespace quabble
 
-int main(int argc, char** argv) {
-    quabble::require(argc == 2, "usage: robot PROGRAM");
-    quabble::Robot robot(argv[1]);
+namespace {
+
+void playWithMouse(quabble::Robot& robot) {
     robot.startProgram();
     robot.play(quabble::GameMode::Training, 1000);
     robot.play(quabble::GameMode::Strategy, 12);
@@ -189,5 +280,25 @@ int main(int argc, char** argv) {
         robot.play(quabble::GameMode::Training, quarters == 6 ? 4 : 8);
         robot.closeAndCheckExit();
     }
+}
+
+void playWithKeys(quabble::Robot& robot) {
+    robot.startProgram();
+    robot.play(quabble::GameMode::Training, 1000);
+    robot.play(quabble::GameMode::Strategy, 6);
+    robot.play(quabble::GameMode::Timed, 3);
+    robot.closeAndCheckExit();
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    quabble::require(argc == 3, "usage: robot mouse|keys PROGRAM");
+    const bool hasMouse = argv[1] == std::string("mouse");
+    quabble::Robot robot(argv[2], hasMouse);
+    if (hasMouse)
+        playWithMouse(robot);
+    else
+        playWithKeys(robot);
     return 0;
 }

@@ -51,8 +51,12 @@ void RunningGame::choose(int button, int clicks) {
 }
 
 void RunningGame::begin(GameMode mode, int clicks) {
-    mode_ = mode;
     choose(static_cast<int>(mode), clicks);
+    waitForBoard(mode);
+}
+
+void RunningGame::waitForBoard(GameMode mode) {
+    mode_ = mode;
     waitUntil("a board", [this] { return readBoard().find('?') == std::string::npos; });
 }
 

@@ -28,6 +28,7 @@ class RunningGame {
     // Chooses a button of the main menu, counted from 1.
     void choose(int button, int clicks = 1);
     void begin(GameMode mode, int clicks = 1);  // comes back when the board is there
+    void waitForBoard(GameMode mode);
     void clickEndGame();
     void waitForExit();  // with status 0
 

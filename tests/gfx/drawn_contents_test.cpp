@@ -1,6 +1,6 @@
 #include <gtest/gtest.h>
 
-#include "../support/bitmap.hpp"
+#include "draw/bitmap_file.hpp"
 #include "../support/large_picture_file.hpp"
 #include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
@@ -78,7 +78,7 @@ TEST_F(Painters, FillTheGaugeFromTheTopAndCopyNoMoreThanThereIs) {
 }
 
 TEST_F(Painters, HaveAStandInForASheetThatCannotBeUsed) {
-    const auto good = bitmapOf(sheet), aRowLess = bitmapOf(Surface(400, 837));
+    const auto good = encodeBitmap(sheet), aRowLess = encodeBitmap(Surface(400, 837));
     const auto cutOff = std::vector(good.begin(), good.end() - 1);
     for (const auto& file : {good, aRowLess, cutOff, {}}) {
         HeadlessFrontEnd frontEnd({{"ALLPICDATA.BMP", file}});
@@ -138,7 +138,7 @@ TEST(Sprites, AreMadeFromALargeVersionThatIsWholeAndBelongsToTheSheet) {
     finer.fill({0, 0, 50, 50}, {250, 250, 250});  // which shows what the sprites were made from
     const Scale scale = Scale::ofQuarters(6);
     const auto isFine = [&](const Surface& plain, const std::vector<std::byte>& file) {
-        HeadlessFrontEnd frontEnd({{"ALLPICDATA.BMP", bitmapOf(plain)}, {"ALLPICDATA.BIG", file}});
+        HeadlessFrontEnd frontEnd({{"ALLPICDATA.BMP", encodeBitmap(plain)}, {"ALLPICDATA.BIG", file}});
         Pictures pictures(frontEnd);
         const Sprites sprites = pictures.sprites(scale);
         EXPECT_TRUE(pictures.sprites(Scale()).tiles[0] == spritesOf(plain, Scale()).tiles[0]);

@@ -44,6 +44,12 @@ SDL_Keycode withoutKeypad(const SDL_Keysym& keysym) {
             return SDLK_LEFT;
         case SDLK_KP_6:
             return SDLK_RIGHT;
+        case SDLK_KP_8:
+            return SDLK_UP;
+        case SDLK_KP_2:
+            return SDLK_DOWN;
+        case SDLK_KP_0:
+            return SDLK_INSERT;
         case SDLK_KP_7:
             return SDLK_HOME;
         case SDLK_KP_1:
@@ -55,7 +61,7 @@ SDL_Keycode withoutKeypad(const SDL_Keysym& keysym) {
     }
 }
 
-// What a key asks of a text being edited, with Ctrl held or not.
+// What a key asks of a text being edited or of the program's pointer, with Ctrl held or not.
 std::optional<EditCommand> commandOf(const SDL_Keysym& keysym) {
     const bool ctrl = (keysym.mod & KMOD_CTRL) != 0;
     switch (withoutKeypad(keysym)) {
@@ -63,6 +69,17 @@ std::optional<EditCommand> commandOf(const SDL_Keysym& keysym) {
             return ctrl ? EditCommand::WordLeft : EditCommand::Left;
         case SDLK_RIGHT:
             return ctrl ? EditCommand::WordRight : EditCommand::Right;
+        case SDLK_UP:
+            return EditCommand::Up;
+        case SDLK_DOWN:
+            return EditCommand::Down;
+        case SDLK_INSERT:
+        case SDLK_APPLICATION:
+        case SDLK_MENU:
+            return EditCommand::Click;
+        case SDLK_RETURN:
+        case SDLK_KP_ENTER:
+            return ctrl ? std::optional(EditCommand::Click) : std::nullopt;
         case SDLK_HOME:
             return EditCommand::Home;
         case SDLK_END:
@@ -82,10 +99,14 @@ std::optional<EditCommand> commandOf(const SDL_Keysym& keysym) {
     }
 }
 
-// A key that is held down is one press; only what it does to a text is repeated.
+// A key that is held down is one press or one click; only the steps of a text's caret and of the pointer, and
+// what changes a text, are repeated.
 std::optional<InputEvent> translateKey(const SDL_KeyboardEvent& event) {
     const bool extends = (event.keysym.mod & KMOD_SHIFT) != 0;
-    if (const auto command = commandOf(event.keysym))
+    const auto command = commandOf(event.keysym);
+    if (command == EditCommand::Click && event.repeat != 0)
+        return std::nullopt;
+    if (command)
         return InputEvent{.kind = EventKind::Edit, .command = *command, .extends = extends};
     const auto key = characterOf(event.keysym);
     if (key && event.repeat == 0)

@@ -1,0 +1,236 @@
+#include <gtest/gtest.h>
+
+#include <functional>
+
+#include "../end_to_end/player.hpp"
+#include "machine.hpp"
+#include "platform/places.hpp"
+
+namespace quabble {
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr Colour ringColour{255, 255, 255};  // which nothing else has
+
+// Someone who has no mouse, and goes by the ring.
+struct KeyboardMachine : Machine {
+    using Machine::Machine;
+
+    // The place that is ringed; an empty one without a ring.
+    Rect ring() {
+        const Surface& seen = user.top().picture;
+        Rect ring{seen.width(), seen.height(), 0, 0};
+        for (std::int32_t y = 0; y < seen.height(); ++y) {
+            const auto row = seen.row(y);
+            const auto first = std::ranges::find(row, pixelOf(ringColour));
+            if (first == row.end())
+                continue;
+            const auto last = std::find(row.rbegin(), row.rend(), pixelOf(ringColour));
+            ring = {std::min(ring.left, static_cast<std::int32_t>(first - row.begin())),
+                    std::min(ring.top, y), std::max(ring.right, static_cast<std::int32_t>(row.rend() - last)),
+                    y + 1};
+        }
+        return ring;
+    }
+
+    std::vector<Point> way;  // where the pointer has been
+
+    // Goes across first, then up or down, until the ring holds the point.
+    void walkTo(std::int32_t x, std::int32_t y) {
+        if (ring().isEmpty())
+            user.edit(EditCommand::Up);
+        int steps = 0;
+        for (Rect at = ring(); !at.contains(x, y); at = ring()) {
+            ASSERT_LT(++steps, 40) << "on the way to " << x << ", " << y;
+            way.push_back(middleOf(at));
+            if (x < at.left)
+                user.edit(EditCommand::Left);
+            else if (x >= at.right)
+                user.edit(EditCommand::Right);
+            else
+                user.edit(y < at.top ? EditCommand::Up : EditCommand::Down);
+        }
+    }
+    void clickBy(std::int32_t x, std::int32_t y) {
+        walkTo(x, y);
+        user.edit(EditCommand::Click);
+    }
+    void chooseFromMenu(int button) { clickBy(337, 52 * button + 18); }
+
+    // Takes the largest cluster, and the waiting row when there is none. False when the game has ended.
+    bool makeMove() {
+        const bool isTraining = game.gameMode == GameMode::Training;
+        const auto [place, size] = choose(model::read(lettersOf(game.grid)));
+        const Rect square = cell(place.first, place.second);
+        if (size >= (isTraining ? 2 : 3))
+            clickBy(square.left + 14, square.top + 14);
+        else
+            clickBy(400, 518);
+        user.wait(600ms);
+        return game.isGameActive();
+    }
+    std::string caption() { return user.top().traits.caption; }
+};
+
+TEST(Keyboard, PlaysAWholeGameOfEachModeFromTheMenuToTheTable) {
+    for (int mode = 1; mode <= 3; ++mode) {
+        SCOPED_TRACE(mode);
+        KeyboardMachine machine{MemoryBlob()};
+        machine.chooseFromMenu(mode);
+        for (int moves = 0; machine.makeMove() && (mode == 1 || moves < 40);) {
+            if (machine.hasDialog())
+                machine.clickBy(230, 215);  // a level is complete
+            ASSERT_LT(++moves, 150);
+        }
+        if (machine.game.isGameActive())
+            machine.clickBy(95, 465);  // End game
+        EXPECT_GT(machine.game.stats.score, 100);
+        ASSERT_EQ(machine.caption(), "Game Statistics");
+        machine.clickBy(230, 215);
+        ASSERT_EQ(machine.caption(), "Best Score");
+        machine.user.type("Joan");
+        machine.user.edit(EditCommand::Left);
+        machine.user.type("h");
+        machine.user.edit(EditCommand::Down);
+        machine.user.type("!");
+        EXPECT_TRUE(machine.ring().contains(180, 170)) << "the OK button";
+        machine.user.edit(EditCommand::Up);
+        machine.user.edit(EditCommand::End);
+        machine.user.type("a");
+        machine.clickBy(180, 170);
+        ASSERT_EQ(machine.caption(), "Best Scores - Quabble");
+        EXPECT_EQ(machine.app.highScores.table(static_cast<std::int16_t>(mode)).names[0], "Joahna");
+        machine.clickBy(150, 420);
+        EXPECT_TRUE(machine.game.mainMenuActive);
+        machine.chooseFromMenu(mode + 3);
+        machine.clickBy(300, 420);  // Clear Scores
+        EXPECT_EQ(machine.app.highScores.table(static_cast<std::int16_t>(mode)).scores[0], 0);
+        machine.clickBy(150, 420);
+        machine.chooseFromMenu(8);
+        EXPECT_TRUE(machine.program.ended());
+    }
+}
+
+// The mouse then comes to where the keys have brought the pointer, and the ring goes: the very picture stays.
+TEST(Keyboard, ShowsWhatTheMouseShowsAndARing) {
+    struct Screen {
+        const char* name;
+        std::function<void(Machine&)> show;
+        std::vector<Point> places;
+    };
+    const Screen screens[] = {
+        {"menu", [](Machine&) {}, {{337, 67}, {337, 330}, {337, 435}}},
+        {"training", [](Machine& machine) { machine.clickMenu(1); }, {{95, 305}, {95, 385}, {246, 51}}},
+        {"strategy", [](Machine& machine) { machine.clickMenu(3); }, {{400, 518}, {95, 465}, {554, 465}}},
+        {"paused", [](Machine& machine) { machine.clickMenu(2), machine.clickPanel(8); }, {{337, 281}}},
+        {"result", [](Machine& machine) { machine.clickMenu(2), machine.clickPanel(10); }, {{231, 219}}},
+        {"scores", [](Machine& machine) { machine.clickMenu(5); }, {{157, 420}, {337, 420}}}};
+    for (const Scale scale : {Scale(), Scale::ofQuarters(6)}) {
+        for (const Screen& screen : screens) {
+            KeyboardMachine machine(7, Scale()), withMouse(7, scale);
+            screen.show(machine);
+            screen.show(withMouse);
+            for (const Point place : screen.places) {
+                SCOPED_TRACE(testing::Message() << screen.name << " at " << place.x << ", " << place.y);
+                machine.walkTo(place.x, place.y);
+                const PointerShape shape = machine.user.top().pointer;
+                machine.frontEnd.rescale(scale);
+                machine.program.wake();
+                machine.user.movePointer(static_cast<float>(place.x), static_cast<float>(place.y));
+                machine.way.push_back(place);
+                for (const Point at : std::exchange(machine.way, {}))
+                    withMouse.user.movePointer(static_cast<float>(at.x), static_cast<float>(at.y));
+                EXPECT_EQ(shape, withMouse.user.top().pointer);
+                EXPECT_TRUE(machine.user.top().picture == withMouse.user.top().picture);
+                machine.frontEnd.rescale(Scale());
+                machine.program.wake();
+            }
+        }
+    }
+}
+
+TEST(Keyboard, StepsFromPlaceToPlace) {
+    KeyboardMachine machine;
+    machine.clickMenu(3);
+    const auto after = [&](const char* keys) {
+        for (const char* key = keys; *key != '\0'; ++key)
+            machine.user.edit(*key == 'L'   ? EditCommand::Left
+                              : *key == 'R' ? EditCommand::Right
+                              : *key == 'U' ? EditCommand::Up
+                                            : EditCommand::Down);
+        return machine.ring();
+    };
+    const Rect pause = Rect::ofSize(25, 370, 140, 30), endGame = Rect::ofSize(25, 450, 140, 30);
+    const Rect strip = Rect::ofSize(232, 504, 336, 28);
+    EXPECT_TRUE(after("").isEmpty());
+    machine.user.movePointer(330, 110);
+    EXPECT_EQ(after("L"), machine.cell(4, 3)) << "the first key shows where the pointer is";
+    EXPECT_EQ(after("RRD"), machine.cell(6, 4));
+    EXPECT_EQ(after("UUUUL"), machine.cell(5, 1)) << "there is nothing above the board";
+    EXPECT_EQ(after("LLLLL"), pause);
+    EXPECT_EQ(after("R"), machine.cell(1, 1)) << "where it came from";
+    EXPECT_EQ(after("RRDDDDDDDDDDDDDDDD"), strip);
+    EXPECT_EQ(after("U"), machine.cell(3, 16));
+    EXPECT_EQ(after("DL"), endGame);
+    EXPECT_EQ(after("DUUUUR"), machine.cell(1, 13)) << "beside the button";
+    EXPECT_EQ(after("RRRRRRRRRRRRRRRRR"), machine.cell(12, 13));
+}
+
+TEST(Keyboard, TheRingGoesWhenTheMouseIsUsedAndNotBefore) {
+    KeyboardMachine machine;
+    machine.user.movePointer(95, 100);
+    const Surface plain = machine.picture();
+    machine.user.edit(EditCommand::Click);
+    EXPECT_TRUE(machine.game.mainMenuActive) << "nobody clicks where no ring was seen";
+    EXPECT_EQ(machine.ring(), Rect::ofSize(225, 105, 225, 30));
+    machine.user.movePointer(95, 100);
+    EXPECT_FALSE(machine.ring().isEmpty()) << "the mouse has not moved";
+    machine.user.movePointer(96, 100);
+    machine.user.movePointer(337, 120);
+    EXPECT_TRUE(machine.ring().isEmpty());
+    machine.user.edit(EditCommand::Down);
+    machine.user.click(20, 20);
+    EXPECT_TRUE(machine.ring().isEmpty());
+    machine.user.press('q');
+    machine.user.edit(EditCommand::Down);
+    EXPECT_TRUE(machine.ring().isEmpty()) << "in a minimised window";
+}
+
+TEST(Keyboard, EndsAPauseAndNothingElseOfIt) {
+    KeyboardMachine machine;
+    machine.start(1, "....11");
+    machine.clickBy(95, 305);  // Pause
+    ASSERT_TRUE(machine.isPaused());
+    EXPECT_EQ(machine.ring(), Rect::ofSize(0, 0, 675, 562));
+    machine.user.edit(EditCommand::Click);
+    EXPECT_FALSE(machine.isPaused());
+    machine.walkTo(machine.cell(5, 16).left + 14, machine.cell(5, 16).top + 14);
+    machine.user.press('q');
+    machine.user.edit(EditCommand::Click);
+    EXPECT_TRUE(machine.isPaused()) << "a hidden game";
+    machine.user.restore();
+    machine.user.edit(EditCommand::Click);
+    EXPECT_FALSE(machine.isPaused());
+    EXPECT_EQ(machine.game.stats.score, 0) << "the click only resumed";
+    machine.user.edit(EditCommand::Click);
+    EXPECT_EQ(machine.game.stats.score, 3);
+}
+
+TEST(Keyboard, KeysInMidMoveActAfterTheStepAsTheMouseDoes) {
+    KeyboardMachine machine;
+    machine.start(3, "....2/11131111");
+    const Rect first = machine.cell(2, 16);
+    machine.clickBy(first.left + 14, first.top + 14);
+    machine.user.wait(100ms);
+    for (const EditCommand command : {EditCommand::Right, EditCommand::Right, EditCommand::Click})
+        machine.user.edit(command);
+    EXPECT_EQ(machine.ring(), first) << "during a pause nothing is delivered";
+    machine.user.wait(25ms);
+    EXPECT_EQ(machine.ring(), machine.cell(4, 16));
+    machine.user.wait(1s);
+    EXPECT_EQ(machine.game.stats.score, 6) << "during a move the board takes no clicks";
+}
+
+}  // namespace
+}  // namespace quabble
