@@ -16,8 +16,8 @@ namespace {
 
 std::string hexOf(std::uint64_t number) {
     std::array<char, 16> digits{};
-    const auto [end, problem] = std::to_chars(digits.begin(), digits.end(), number, 16);
-    const std::string text(digits.begin(), end);
+    const auto [end, problem] = std::to_chars(digits.data(), digits.data() + digits.size(), number, 16);
+    const std::string text(digits.data(), end);
     return std::string(digits.size() - text.size(), '0') + text;
 }
 
