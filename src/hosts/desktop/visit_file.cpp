@@ -39,12 +39,13 @@ void VisitFile::writeIfAsked() const {
     write();
 }
 
-// The program stands still where it has failed, and to write its record takes no memory. When this returns
-// the process ends, as it would have.
+// The program stands still where it has failed, and to write its record takes no memory. Then the process
+// ends as it would have.
 void VisitFile::onAbort(int) {
     std::signal(SIGABRT, SIG_DFL);
     if (current != nullptr)
         current->write();
+    std::raise(SIGABRT);
 }
 
 // A file that cannot be written is as good as none: there is nobody to tell.
