@@ -11,17 +11,24 @@ namespace {
 
 constexpr mode_t userOnlyFile = 0600;
 
-const VisitFile* current = nullptr;
-volatile std::sig_atomic_t isAsked = 0;
+// What signals can reach: the one file, and whether it was asked for.
+const VisitFile*& current() {
+    static const VisitFile* file = nullptr;
+    return file;
+}
+volatile std::sig_atomic_t& isAsked() {
+    static volatile std::sig_atomic_t asked = 0;
+    return asked;
+}
 
 extern "C" void noteUserSignal(int) {
-    isAsked = 1;
+    isAsked() = 1;
 }
 
 }  // namespace
 
 VisitFile::VisitFile(const Program& program, std::string path) : program_(program), path_(std::move(path)) {
-    current = this;
+    current() = this;
     std::signal(SIGUSR1, noteUserSignal);
     std::signal(SIGABRT, &VisitFile::onAbort);
 }
@@ -29,13 +36,13 @@ VisitFile::VisitFile(const Program& program, std::string path) : program_(progra
 VisitFile::~VisitFile() {
     std::signal(SIGUSR1, SIG_DFL);
     std::signal(SIGABRT, SIG_DFL);
-    current = nullptr;
+    current() = nullptr;
 }
 
 void VisitFile::writeIfAsked() const {
-    if (isAsked == 0)
+    if (isAsked() == 0)
         return;
-    isAsked = 0;
+    isAsked() = 0;
     write();
 }
 
@@ -43,8 +50,8 @@ void VisitFile::writeIfAsked() const {
 // ends as it would have.
 void VisitFile::onAbort(int) {
     std::signal(SIGABRT, SIG_DFL);
-    if (current != nullptr)
-        current->write();
+    if (current() != nullptr)
+        current()->write();
     std::raise(SIGABRT);
 }
 
