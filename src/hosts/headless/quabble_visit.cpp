@@ -100,9 +100,9 @@ std::optional<Options> readOptions(int argc, char** argv) {
 }
 
 // Plays one visit.
-class Session {
+class Play {
  public:
-    Session(const Options& options, const HeadlessFrontEnd::Files& files, std::string path)
+    Play(const Options& options, const HeadlessFrontEnd::Files& files, std::string path)
         : options_(options), files_(files), path_(std::move(path)) {}
 
     // False when something differs, or when a file cannot be read or written.
@@ -202,7 +202,7 @@ int main(int argc, char** argv) {
         std::puts("The program's pictures are not there; numbered tiles stand in for them.");
     int failed = 0;
     for (const std::string& visit : options->visits)
-        failed += quabble::Session(*options, files, visit).run() ? 0 : 1;
+        failed += quabble::Play(*options, files, visit).run() ? 0 : 1;
     std::printf("%zu visits, %d of them other than expected\n", options->visits.size(), failed);
     return failed == 0 ? EXIT_SUCCESS : EXIT_FAILURE;
 }
