@@ -25,8 +25,8 @@ class Line {
     }
     Line& operator<<(std::integral auto number) {
         std::array<char, 24> digits;
-        const auto [end, problem] = std::to_chars(digits.begin(), digits.end(), number);
-        return *this << std::string_view(digits.begin(), end);
+        const auto [end, problem] = std::to_chars(digits.data(), digits.data() + digits.size(), number);
+        return *this << std::string_view(digits.data(), end);
     }
     std::string_view text() const { return {characters_.data(), size_}; }
 

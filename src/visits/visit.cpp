@@ -15,8 +15,9 @@ using Words = std::span<const std::string_view>;
 template <typename Number>
 std::optional<Number> numberOf(std::string_view word) {
     Number number{};
-    const char* end = word.data() + word.size();
-    const auto [next, problem] = std::from_chars(word.data(), end, number);
+    const std::span<const char> letters(word);
+    const char* end = letters.data() + letters.size();
+    const auto [next, problem] = std::from_chars(letters.data(), end, number);
     return problem == std::errc() && next == end && !word.empty() ? std::optional(number) : std::nullopt;
 }
 

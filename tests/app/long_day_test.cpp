@@ -17,6 +17,7 @@ class LongDay {
  public:
     TimePoint now() { return elapsed_ + (machine_->frontEnd.now() - TimePoint{}); }
     int games() const { return games_; }
+    std::string record() const { return recordOf(machine_->program); }
 
     void playGame() {
         ++games_;
@@ -117,7 +118,7 @@ TEST(LongDay, EveryScoreIsKeptAndNothingIsLeftBehind) {
     std::size_t memory = 0;
     while (day.now() - TimePoint{} < hours) {
         day.playGame();
-        ASSERT_FALSE(HasFailure()) << "game " << day.games();
+        ASSERT_FALSE(HasFailure()) << "game " << day.games() << "\n" << day.record();
         if (day.games() == 12)
             memory = heapInUse();
     }

@@ -3,8 +3,8 @@
 #include <set>
 
 #include "../engine/board_notation.hpp"
-#include "draw/bitmap_file.hpp"
 #include "app/program.hpp"
+#include "draw/bitmap_file.hpp"
 #include "gfx/painters.hpp"
 #include "hosts/headless/memory_blob.hpp"
 #include "hosts/headless/scripted_user.hpp"
@@ -37,6 +37,13 @@ inline HeadlessFrontEnd::Files makeProgramFiles() {
     return {{"ALLPICDATA.BMP", encodeBitmap(picture)}};
 }
 inline const HeadlessFrontEnd::Files programFiles = makeProgramFiles();
+
+// The visit that does again what was done since the last game began.
+inline std::string recordOf(const Program& program) {
+    std::string text;
+    program.writeVisit([&](std::string_view line) { text += line; });
+    return text;
+}
 
 // The program on its main menu, with high scores that are out of reach. Buttons are counted from 1.
 struct Machine {

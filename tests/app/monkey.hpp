@@ -15,10 +15,22 @@ class Monkey {
     // A number below the one given, at least 0.
     using Chance = std::function<int(int)>;
 
-    explicit Monkey(Chance chance) : upTo(std::move(chance)) {}
+    // What else is to be well after every act.
+    using Check = std::function<void(Machine&)>;
+
+    explicit Monkey(
+        Chance chance, Check alsoCheck = [](Machine&) {})
+        : upTo(std::move(chance)), alsoCheck_(std::move(alsoCheck)) {}
+
+    // It goes to the end of levels by a way that no player has, and that no record tells of.
+    void skipRows() { skipsRows_ = true; }
+
+    // Whether the next act begins on a machine of its own.
+    bool beginsAnew() const { return !machine_ || machine_->program.ended(); }
+    std::string record() const { return recordOf(machine_->program); }
 
     void actAndCheck() {
-        if (!machine_ || machine_->program.ended()) {
+        if (beginsAnew()) {
             machine_ = std::make_unique<Machine>(static_cast<std::uint64_t>(upTo(256)));
             gamesEnded_ = 0;
             results_.clear();
@@ -91,7 +103,7 @@ class Monkey {
 
     // Goes near the end of the level, on a board with something of everything.
     void skipToLastRows() {
-        if (!machine_->game.arcadeActive || !isSettled())
+        if (!skipsRows_ || !machine_->game.arcadeActive || !isSettled())
             return;
         machine_->game.rowsEntered = 43 + 3 * machine_->game.stats.level + upTo(2);
         machine_->setBoard("..11....S/.222211aS/121112122122");
@@ -121,6 +133,7 @@ class Monkey {
             EXPECT_FALSE(paused);
         }
         EXPECT_EQ(results_.size(), gamesEnded_);
+        alsoCheck_(*machine_);
         if (upTo(100) == 99)
             checkPainting();
         if (!settled)
@@ -164,6 +177,8 @@ class Monkey {
     }
 
     Chance upTo;
+    Check alsoCheck_;
+    bool skipsRows_ = false;
     std::unique_ptr<Machine> machine_;
     std::size_t gamesEnded_ = 0;
     std::set<WindowId> results_;

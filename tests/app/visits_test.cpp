@@ -11,12 +11,6 @@ namespace {
 
 using namespace std::chrono_literals;
 
-std::string recordOf(const Program& program) {
-    std::string text;
-    program.writeVisit([&](std::string_view line) { text += line; });
-    return text;
-}
-
 // What the topmost window shows when a recorded visit has been played, or why it could not be.
 struct Replay {
     Surface picture;

@@ -1,6 +1,7 @@
 // Does to the windows what desktops and hasty people do to them: windows PROGRAM.
 
 #include <X11/keysym.h>
+#include <sys/wait.h>
 
 #include <chrono>
 #include <csignal>
@@ -12,6 +13,7 @@
 #include "../support/files.hpp"
 #include "desktop.hpp"
 #include "gfx/palette.hpp"
+#include "hosts/headless/visit_player.hpp"
 #include "player.hpp"
 #include "running_game.hpp"
 
@@ -22,7 +24,10 @@ using namespace std::chrono_literals;
 
 class Story {
  public:
-    explicit Story(std::string program) : game_(desktop_, std::move(program)) { game_.start(); }
+    explicit Story(const std::string& program)
+        : folder_(std::filesystem::path(program).parent_path()), game_(desktop_, program) {
+        game_.start();
+    }
 
     void aMinimisedGameStaysAwayAndComesBackPaused(GameMode mode) {
         game_.begin(mode);
@@ -127,12 +132,50 @@ class Story {
         leaveGame();
     }
 
+    // What was done here is done again without a screen, and the same is seen.
+    void theRecordOfAGameIsPlayedAnywhere() {
+        game_.begin(GameMode::Strategy);
+        for (int move = 0; move < 3; ++move) {
+            beginMove();
+            std::this_thread::sleep_for(1s);
+        }
+        desktop_.press(XK_Down);
+        std::this_thread::sleep_for(300ms);
+        kill(game_.process(), SIGUSR1);
+        require(replayedPicture() == game_.look(), "the very picture");
+        beginMove();
+        kill(game_.process(), SIGABRT);
+        int status = 0;
+        waitpid(game_.process(), &status, 0);
+        require(WIFSIGNALED(status) && WTERMSIG(status) == SIGABRT, "an end by SIGABRT");
+        require(!replayedPicture().bounds().isEmpty(), "a record of the end, too");
+    }
+
     void close() {
         desktop_.clickCloseButton(game_.window());
         game_.waitForExit();
     }
 
  private:
+    // Of the record that the program is about to write, when it has been played to its end as it says.
+    Surface replayedPicture() const {
+        const std::filesystem::path file =
+            std::filesystem::path(std::getenv("XDG_DATA_HOME")) / "quabble/last_game.visit";
+        std::string text;
+        waitUntil("a whole record",
+                  [&] { return (text = bytesOf(file)).find("expect level") != std::string::npos; });
+        std::filesystem::remove(file);
+        const auto read = parseVisit(text);
+        require(std::holds_alternative<Visit>(read), "a record that can be read");
+        const Visit& visit = std::get<Visit>(read);
+        VisitPlayer player(visit, picturesIn(folder_));
+        for (const VisitStep& step : visit.steps) {
+            player.play(step);
+            require(step.kind != VisitStep::Kind::Expect || player.isAsExpected(step), "the same figures");
+        }
+        return player.picture();
+    }
+
     void beginMove() {
         const std::string before = game_.readBoard();
         const Choice best = choose(model::read(before));
@@ -178,6 +221,7 @@ class Story {
         waitUntil("the end of " + caption, [&] { return !desktop_.hasWindow(caption); });
     }
 
+    std::filesystem::path folder_;  // of the program
     Desktop desktop_;
     RunningGame game_;
 };
@@ -199,6 +243,7 @@ int main(int argc, char** argv) {
     story.anOfferToDropSomethingUnknownDoesNoHarm();
     story.aRestoredWindowHasItsPictureAtOnce();
     story.close();
+    quabble::Story(argv[1]).theRecordOfAGameIsPlayedAnywhere();
     quabble::Story(argv[1]).aDestroyedDialogWasClosedAndADestroyedMainWindowEndsTheProgram();
     return 0;
 }

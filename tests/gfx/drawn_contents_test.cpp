@@ -1,7 +1,7 @@
 #include <gtest/gtest.h>
 
-#include "draw/bitmap_file.hpp"
 #include "../support/large_picture_file.hpp"
+#include "draw/bitmap_file.hpp"
 #include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/pictures.hpp"

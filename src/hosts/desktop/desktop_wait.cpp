@@ -12,7 +12,7 @@ namespace quabble {
 DesktopWait::DesktopWait() {
     sigset_t ends;
     sigemptyset(&ends);
-    for (const int signal : {SIGINT, SIGTERM, SIGHUP})
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGUSR1})
         sigaddset(&ends, signal);
     sigprocmask(SIG_BLOCK, &ends, &before_);
 }

@@ -9,8 +9,9 @@ struct SDL_Window;
 
 namespace quabble {
 
-// Sleeps until the desktop has something to say. Requests to end the process (SIGINT, SIGTERM, SIGHUP) are
-// let in during the sleep alone, so that none can slip in just before it and be slept over.
+// Sleeps until the desktop has something to say. Requests to end the process (SIGINT, SIGTERM, SIGHUP) or to
+// write its record (SIGUSR1) are let in during the sleep alone, so that none can slip in just before it and
+// be slept over.
 class DesktopWait {
  public:
     DesktopWait();

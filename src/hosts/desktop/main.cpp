@@ -23,8 +23,11 @@ int main() {
         return EXIT_FAILURE;
     }
     const auto clock = std::chrono::system_clock::now().time_since_epoch().count();
-    quabble::SqliteRegistryStore registry(quabble::userRegistryPath("quabble"));
+    const std::string registryPath = quabble::userRegistryPath("quabble");
+    quabble::SqliteRegistryStore registry(registryPath);
     quabble::Program program(*frontEnd, registry, static_cast<std::uint64_t>(clock));
-    frontEnd->run(program);
+    const std::string folder = registryPath.substr(0, registryPath.find_last_of('/'));
+    const quabble::VisitFile record(program, folder + "/last_game.visit");
+    frontEnd->run(program, record);
     return EXIT_SUCCESS;
 }

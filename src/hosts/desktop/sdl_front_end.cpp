@@ -83,7 +83,7 @@ SdlFrontEnd::~SdlFrontEnd() {
     SDL_Quit();
 }
 
-void SdlFrontEnd::run(Program& program) {
+void SdlFrontEnd::run(Program& program, const VisitFile& record) {
     program.start();
     // The program then ends as it would when asked to, but has no windows any more to close.
     X11Window::whenServerGoes([this, &program] {
@@ -93,6 +93,7 @@ void SdlFrontEnd::run(Program& program) {
     });
     while (!program.ended()) {
         waitForEvents(program);
+        record.writeIfAsked();
         program.wake();
     }
     X11Window::whenServerGoes([] {});

@@ -10,6 +10,7 @@
 #include "app/program.hpp"
 #include "hosts/desktop/desktop_wait.hpp"
 #include "hosts/desktop/desktop_window.hpp"
+#include "hosts/desktop/visit_file.hpp"
 #include "hosts/desktop/x11/held_keys.hpp"
 #include "hosts/desktop/x11/x11_events.hpp"
 #include "platform/front_end.hpp"
@@ -29,7 +30,7 @@ class SdlFrontEnd final : public FrontEnd {
     SdlFrontEnd& operator=(const SdlFrontEnd&) = delete;
 
     // Starts the program, waits for the desktop's events and passes them on, until the program has ended.
-    void run(Program& program);
+    void run(Program& program, const VisitFile& record);
 
     TimePoint now() override { return Clock::now(); }
     Scale createWindow(WindowId window, const NativeWindow& traits) override;

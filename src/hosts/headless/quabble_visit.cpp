@@ -32,10 +32,11 @@ std::optional<std::string> readFile(const std::string& path) {
         return std::nullopt;
     std::string content;
     std::vector<char> part(65536);
-    while (const std::size_t size = std::fread(part.data(), 1, part.size(), file))
-        content.append(part.data(), size);
+    while (std::feof(file) == 0 && std::ferror(file) == 0)
+        content.append(part.data(), std::fread(part.data(), 1, part.size(), file));
+    const bool isWhole = std::ferror(file) == 0;
     std::fclose(file);
-    return content;
+    return isWhole ? std::optional(content) : std::nullopt;
 }
 
 bool writeFile(const std::string& path, const void* bytes, std::size_t size) {
@@ -99,9 +100,9 @@ std::optional<Options> readOptions(int argc, char** argv) {
 }
 
 // Plays one visit.
-class Session {
+class Play {
  public:
-    Session(const Options& options, const HeadlessFrontEnd::Files& files, std::string path)
+    Play(const Options& options, const HeadlessFrontEnd::Files& files, std::string path)
         : options_(options), files_(files), path_(std::move(path)) {}
 
     // False when something differs, or when a file cannot be read or written.
@@ -113,9 +114,9 @@ class Session {
         if (const auto* problem = std::get_if<VisitProblem>(&read))
             return complain(problem->line, problem->what);
         splitLines(*text);
-        const Visit& visit = std::get<Visit>(read);
-        VisitPlayer player(visit, files_, options_.scale);
-        for (const VisitStep& step : visit.steps) {
+        const auto* visit = std::get_if<Visit>(&read);
+        VisitPlayer player(*visit, files_, options_.scale);
+        for (const VisitStep& step : visit->steps) {
             player.play(step);
             if (step.kind == VisitStep::Kind::Expect && !look(player, step))
                 return false;
@@ -201,7 +202,7 @@ int main(int argc, char** argv) {
         std::puts("The program's pictures are not there; numbered tiles stand in for them.");
     int failed = 0;
     for (const std::string& visit : options->visits)
-        failed += quabble::Session(*options, files, visit).run() ? 0 : 1;
+        failed += quabble::Play(*options, files, visit).run() ? 0 : 1;
     std::printf("%zu visits, %d of them other than expected\n", options->visits.size(), failed);
     return failed == 0 ? EXIT_SUCCESS : EXIT_FAILURE;
 }

@@ -54,7 +54,7 @@ class ScriptedUser {
     void restore() { frontEnd_.restoreWindow(topWindow()), program_.wake(); }
 
     // Lets time pass; everything that falls due meanwhile happens at its own moment.
-    void wait(milliseconds duration) {
+    void wait(Clock::duration duration) {
         const TimePoint end = frontEnd_.now() + duration;
         for (auto due = program_.nextDeadline(); due && *due <= end; due = program_.nextDeadline()) {
             frontEnd_.advanceTo(*due);

@@ -16,8 +16,8 @@ namespace {
 
 std::string hexOf(std::uint64_t number) {
     std::array<char, 16> digits{};
-    const auto [end, problem] = std::to_chars(digits.begin(), digits.end(), number, 16);
-    const std::string text(digits.begin(), end);
+    const auto [end, problem] = std::to_chars(digits.data(), digits.data() + digits.size(), number, 16);
+    const std::string text(digits.data(), end);
     return std::string(digits.size() - text.size(), '0') + text;
 }
 
@@ -57,7 +57,6 @@ VisitPlayer::VisitPlayer(const Visit& visit, HeadlessFrontEnd::Files files, std:
       frontEnd_(std::move(files)),
       program_(frontEnd_, registry_, visit.seed),
       start_(frontEnd_.now()) {
-    frontEnd_.connect([this](const InputEvent& event) { program_.post(event); });
     frontEnd_.scale = scale.value_or(visit.scale);
     program_.state().random.skip(visit.drawn);
     program_.start();
@@ -98,16 +97,10 @@ void VisitPlayer::give(const VisitStep& step) {
 }
 
 void VisitPlayer::advanceTo(microseconds time) {
-    const TimePoint end = start_ + time;
-    if (!visit_.areWakesWritten) {
-        for (auto due = program_.nextDeadline(); due && *due <= end; due = program_.nextDeadline()) {
-            frontEnd_.advanceTo(*due);
-            program_.wake();
-        }
-    }
-    frontEnd_.advanceTo(end);
-    if (!visit_.areWakesWritten)
-        program_.wake();
+    if (visit_.areWakesWritten)
+        frontEnd_.advanceTo(start_ + time);
+    else
+        user_.wait(start_ + time - frontEnd_.now());
 }
 
 void VisitPlayer::act(const VisitStep& step) {

@@ -6,6 +6,7 @@
 #include "app/program.hpp"
 #include "hosts/headless/headless_front_end.hpp"
 #include "hosts/headless/memory_blob.hpp"
+#include "hosts/headless/scripted_user.hpp"
 #include "visits/visit.hpp"
 
 namespace quabble {
@@ -39,6 +40,7 @@ class VisitPlayer {
     MemoryBlob kept_;
     BlobRegistryStore registry_{kept_};
     Program program_;
+    ScriptedUser<Program> user_{frontEnd_, program_};
     TimePoint start_;
 };
 
