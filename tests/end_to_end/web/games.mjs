@@ -44,4 +44,38 @@ export default {
       await visit.close();
     }
   },
+
+  'rows push in from below by themselves in a Timed game': async (browser) => {
+    const visit = await Visit.open(browser, site.address);
+    await visit.choose(menu.timed);
+    const before = await visit.untilBoard(false);
+    const after = await until('row from below', async () => {
+      const seen = await visit.board(false);
+      return !seen.includes('?') && seen !== before && seen;
+    }, 60);
+    expect(after.startsWith(before.slice(12, 180)), 'A row came in, but the rows above it did not move up by one.');
+    await visit.close();
+  },
+
+  'a key pauses, and so does hiding the page; a click goes on': async (browser) => {
+    const visit = await Visit.open(browser, site.address);
+    await visit.choose(menu.timed);
+    const board = await visit.untilBoard(false);
+    const goOn = async () => {
+      await wait(1500);
+      expect((await visit.board(false)).includes('?'), 'Nothing hides the board of a paused game.');
+      expect((await visit.see(() => window.seen.alarms.size)) === 0, 'The clock goes on in a paused game.');
+      await visit.click(400, 300);
+      expect((await visit.untilBoard(false)) === board, 'After a pause the board is another one.');
+    };
+    await visit.tab.keyboard.press('p');
+    await (await visit.tab.waitForSelector('.minimised')).click();
+    await goOn();
+    await visit.whileHidden();
+    await goOn();
+    await visit.tab.keyboard.press('ArrowUp');
+    await visit.tab.keyboard.press('F2');
+    expect((await visit.board(false)) === board, 'A key that yields no character has paused the game.');
+    await visit.close();
+  },
 };
