@@ -21,8 +21,10 @@ function isOnlyPage() {
 export class Keeping {
   /** What lies there, as far as we know: nobody else's is written over. */
   #known = /** @type {string | null} */ (null);
-  #isRead = false;
   #isOurs = false;
+  /** Whether what was last to be kept is; nothing when the program has kept nothing, as it does when it cannot read what
+   * lies there, and has told so. */
+  isKept = /** @type {boolean | undefined} */ (undefined);
 
   /** Resolves to whether this page may keep things; if not, another one is open. */
   async open() {
@@ -34,25 +36,24 @@ export class Keeping {
     return this.#isOurs;
   }
 
-  /** Whether it could be read when it was last asked for; if not, the program has told the player. */
-  get isReadable() {
-    return this.#isRead;
-  }
-
   /** @returns {Uint8Array | null} */
   read() {
     try {
       this.#known = localStorage.getItem(name);
-      this.#isRead = true;
       return Uint8Array.from(this.#known ?? '', (character) => character.charCodeAt(0));
     } catch {
-      this.#isRead = false;
       return null;
     }
   }
 
   /** @param {Uint8Array} bytes */
   write(bytes) {
+    this.isKept = this.#write(bytes);
+    return this.isKept;
+  }
+
+  /** @param {Uint8Array} bytes */
+  #write(bytes) {
     try {
       if (!this.#isOurs || localStorage.getItem(name) !== this.#known) return false;
       const text = String.fromCharCode(...bytes);

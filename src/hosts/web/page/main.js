@@ -55,20 +55,20 @@ async function play() {
   const isOpened = keeping.open();
   const [module, files] = await Promise.all([loadProgram(), filesOf('pictures')]);
   let isTold = false;
-  /** Said once: the program itself tells of what cannot be read. @param {boolean} isKept */
-  const tellIfLost = (isKept) => {
-    if (isKept || isTold || !keeping.isOurs || !keeping.isReadable) return;
+  /** Said once. */
+  const keep = () => {
+    program.keep();
+    if (keeping.isKept !== false || isTold || !keeping.isOurs) return;
     isTold = true;
     notice.textContent = 'Settings and high scores cannot be kept: the browser refuses to store them.';
   };
   const program = new Program(files, keeping, {
-    end: (isKept) =>
-      showEnd(isKept ? 'Quabble has ended. Settings and high scores are kept.'
+    end: () =>
+      showEnd(keeping.isKept ? 'Quabble has ended. Settings and high scores are kept.'
                      : 'Quabble has ended. Settings and high scores could not be kept.'),
     fail,
     open,
   });
-  const keep = () => tellIfLost(program.keep());
   document.addEventListener('visibilitychange', () => {
     program.call('setHidden', document.hidden);
     if (document.hidden) keep();

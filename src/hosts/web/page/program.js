@@ -19,7 +19,7 @@ export class Program {
   /**
    * @param {Files} files
    * @param {Keeping} keeping
-   * @param {{end: (isKept: boolean) => void, fail: (reason: unknown) => void, open: (document: string) => void}} page
+   * @param {{end: () => void, fail: (reason: unknown) => void, open: (document: string) => void}} page
    */
   constructor(files, keeping, page) {
     this.files = files;
@@ -74,16 +74,16 @@ export class Program {
     return this.call(name, ...values);
   }
 
-  /** Saves what should last; false when it could not be kept. */
+  /** Saves what should last. */
   keep() {
-    return this.#isOver || this.call('keep') === 1;
+    this.call('keep');
   }
 
   #settle() {
     clearTimeout(this.#alarm);
     if (this.#exports.ended()) {
       this.#isOver = true;
-      this.page.end(this.#exports.keep() === 1);
+      this.page.end();
       return;
     }
     const deadline = this.#exports.nextDeadline();

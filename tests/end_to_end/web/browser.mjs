@@ -1,0 +1,319 @@
+// What all stories share: a real browser, a visit to the page in it, and a player who sees the canvas.
+//   node tell.mjs BROWSER STORIES BUILD
+import {execFileSync} from 'node:child_process';
+import {mkdtempSync, mkdirSync, readFileSync, rmSync, writeFileSync} from 'node:fs';
+import {createRequire} from 'node:module';
+import {tmpdir} from 'node:os';
+import {join, resolve} from 'node:path';
+import {serve, addressOf} from '../../../src/hosts/web/serve.mjs';
+
+export const browserName = process.argv[2];
+const build = resolve(process.argv[4]);
+export const pageFolder = join(build, 'page');
+const pictures = join(build, 'program_files', 'bin');
+const require = createRequire(join(build, 'src/hosts/web/tools/'));
+const puppeteer = require('puppeteer-core');
+export const {PNG} = require('pngjs');
+
+export const isFirefox = browserName === 'firefox';
+/** A window of this size in the page shows the program at scale 1. */
+const desktop = {width: 800, height: 640, ratio: 1};
+export const menu = {training: 1, timed: 2, strategy: 3, trainingTable: 4, timedTable: 5, strategyTable: 6, help: 7, exit: 8};
+/** How wide the windows' client areas are, in the program's pixels. */
+const widths = {'Quabble  Ver 1.0': 675, 'Game Statistics': 457, 'Best Score': 360, 'Best Scores - Quabble': 473};
+export const keys = {enter: 13, escape: 27};
+
+/** What does not hold is told in one sentence. */
+export function expect(isTrue, sentence) {
+  if (!isTrue) throw new Error(sentence);
+}
+
+export async function until(what, isTrue, seconds = 10) {
+  for (const end = Date.now() + 1000 * seconds; Date.now() < end; await wait(20)) {
+    const found = await isTrue();
+    if (found) return found;
+  }
+  throw new Error(`There was no ${what} within ${seconds} seconds.`);
+}
+
+export const wait = (milliseconds) => new Promise((done) => setTimeout(done, milliseconds));
+
+/** A folder that is gone when the stories are told. */
+const folders = [];
+export function newFolder() {
+  folders.push(mkdtempSync(join(tmpdir(), 'quabble_page_')));
+  return folders.at(-1);
+}
+export const removeFolders = () => folders.forEach((folder) => rmSync(folder, {recursive: true, force: true}));
+
+/** A browser of its own; without cookies it lets no page keep anything. */
+export function launch({cookies = true} = {}) {
+  if (isFirefox) {
+    return puppeteer.launch({
+      browser: 'firefox', executablePath: '/usr/bin/firefox-esr', headless: true,
+      extraPrefsFirefox: cookies ? {} : {'network.cookie.cookieBehavior': 2},
+    });
+  }
+  const profile = newFolder();
+  if (!cookies) {
+    mkdirSync(join(profile, 'Default'));
+    const preferences = {profile: {default_content_setting_values: {cookies: 2}}};
+    writeFileSync(join(profile, 'Default', 'Preferences'), JSON.stringify(preferences));
+  }
+  return puppeteer.launch({
+    executablePath: '/usr/bin/chromium', headless: true, userDataDir: profile,
+    args: ['--no-sandbox', '--disable-gpu', '--disable-quic', '--no-first-run', '--disable-background-networking',
+      '--disable-component-update', '--disable-sync'],
+  });
+}
+
+/** The site, served by this machine; its address is `address`. */
+export async function serveSite(folder = join(pageFolder, 'site')) {
+  const server = await serve(folder);
+  return {address: addressOf(server), close: () => (server.closeAllConnections(), new Promise((done) => server.close(done)))};
+}
+
+/** Runs in the page before its own script: what is looked at from outside, and which alarms are set. */
+function watch() {
+  const alarms = new Set();
+  const {setTimeout: set, clearTimeout: clear} = window;
+  const seen = {alarms, frames: 0};
+  window.setTimeout = (act, ...rest) => {
+    const alarm = set(() => (alarms.delete(alarm), act()), ...rest);
+    alarms.add(alarm);
+    return alarm;
+  };
+  window.clearTimeout = (alarm) => (alarms.delete(alarm), clear(alarm));
+  const {requestAnimationFrame: request} = window;
+  window.requestAnimationFrame = (act) => (++seen.frames, request(act));
+  if (window.WebAssembly) {
+    const make = WebAssembly.instantiate;
+    WebAssembly.instantiate = async (module, imports) => {
+      const made = await make(module, imports);
+      seen.exports = (made.instance ?? made).exports;
+      return made;
+    };
+  }
+  document.addEventListener('securitypolicyviolation', (event) =>
+    console.error(`The policy forbade ${event.violatedDirective} ${event.blockedURI} ${event.sample}`));
+
+  seen.top = () => [...document.querySelectorAll('.frame.seen:not([hidden]) canvas')].at(-1);
+  const fingerprint = (left, top, width, height) => {
+    const {data} = seen.top().getContext('2d').getImageData(left, top, width, height);
+    let hash = 0x811c9dc5;
+    for (let i = 0; i < data.length; i += 4)
+      hash = Math.imul(hash ^ ((data[i] << 16) | (data[i + 1] << 8) | data[i + 2]), 0x01000193);
+    return hash >>> 0;
+  };
+  seen.picture = () => fingerprint(0, 0, seen.top().width, seen.top().height);
+  seen.cells = (left, top) => Array.from({length: 192}, (_, i) =>
+    fingerprint(left + (i % 12) * 28, top + Math.floor(i / 12) * 28, 28, 28));
+  window.seen = seen;
+}
+
+/** Somebody at the page. What is done to windows is noted, to be done again on the machine without a screen. */
+export class Visit {
+  acts = [];
+  pictures = [];
+  #complaints = [];
+  #context = null;
+
+  /** Comes back when the menu is there, unless something else is to be waited for. */
+  static async open(browser, address, {width, height, ratio, seed = 7, before, touch = false, context, until = 'menu'} = {}) {
+    const visit = new Visit();
+    visit.#context = context ? null : await browser.createBrowserContext();
+    visit.context = context ?? visit.#context;
+    visit.tab = await visit.context.newPage();
+    visit.watchTab(visit.tab);
+    width ??= desktop.width;
+    height ??= desktop.height;
+    await visit.tab.setViewport({width, height, deviceScaleFactor: ratio ?? desktop.ratio, ...(touch && {hasTouch: true})});
+    await visit.tab.evaluateOnNewDocument(watch);
+    if (before) await visit.tab.evaluateOnNewDocument(before);
+    await visit.tab.goto(`${address}#seed=${seed}`);
+    if (until === 'menu') await visit.untilMenu();
+    return visit;
+  }
+
+  watchTab(tab) {
+    tab.on('console', (message) => {
+      const isOurLooking = message.text().startsWith('Canvas2D: Multiple readback');
+      if (['error', 'warn', 'warning'].includes(message.type()) && !isOurLooking) this.#complaints.push(message.text());
+    });
+    tab.on('pageerror', (error) => this.#complaints.push(error.message));
+  }
+
+  /** Whatever the browser has complained of must have been expected. */
+  async close({expected = /^$/} = {}) {
+    const complaints = this.#complaints.filter((complaint) => !expected.test(complaint));
+    await (this.#context ?? this.tab).close();
+    expect(complaints.length === 0, `The browser complained: ${complaints.join('; ')}`);
+  }
+
+  see(read, ...values) {
+    return this.tab.evaluate(read, ...values);
+  }
+  /** The captions of the windows, the topmost last. */
+  captions() {
+    return this.see(() => [...document.querySelectorAll('.frame.seen:not([hidden])')].map((frame) => frame.ariaLabel));
+  }
+  notice() {
+    return this.see(() => document.getElementById('notice').textContent);
+  }
+  /** What the page says when the program is no more. */
+  ending() {
+    return this.tab.waitForSelector('.ended p').then((text) => text.evaluate((element) => element.textContent));
+  }
+  async untilWindow(caption) {
+    await until(`window "${caption}"`, async () => (await this.captions()).at(-1) === caption);
+  }
+  /** The main window in its final sharpness. */
+  async untilMenu() {
+    await this.tab.waitForFunction(() => document.querySelector('.bar')?.parentElement.classList.contains('seen'));
+    await this.atRest();
+  }
+  /** Until nothing is going to happen by itself. */
+  async atRest() {
+    await this.tab.waitForFunction(() => window.seen.alarms.size === 0 && window.seen.top()?.style.imageRendering === 'pixelated');
+  }
+
+  /** Where the program's pixel of the topmost window is in the page. */
+  async placeOf(x, y) {
+    const client = widths[(await this.captions()).at(-1)];
+    return this.see((x, y, client) => {
+      const {left, top, width} = window.seen.top().getBoundingClientRect();
+      return [left + ((x + 0.5) * width) / client, top + ((y + 0.5) * width) / client];
+    }, x, y, client);
+  }
+  async click(x, y) {
+    await this.tab.mouse.click(...(await this.placeOf(x, y)));
+    await this.tab.mouse.move(1, 1); // away from a window that appears there
+    await this.#note(`click ${x} ${y}`);
+  }
+  choose(button) {
+    return this.click(337, 15 + 52 * button + 2);
+  }
+  async type(text) {
+    await this.tab.keyboard.type(text);
+    await this.#note(`type ${text}`);
+  }
+  async press(key, code) {
+    await this.tab.keyboard.press(key);
+    await this.#note(`press ${code}`);
+  }
+  async #note(act) {
+    if (!this.isNoting) return;
+    await this.atRest();
+    this.acts.push(act);
+    this.pictures.push(await this.see(() => window.seen.top() && window.seen.picture()));
+  }
+  /** Notes what was done in another way, as the acts that it ought to have come to. */
+  async cameTo(...acts) {
+    for (const act of acts.slice(0, -1)) {
+      this.acts.push(act);
+      this.pictures.push(null);
+    }
+    await this.#note(acts.at(-1));
+  }
+
+  /** Another tab comes in front of the page, which hides it, and goes again. */
+  async whileHidden(act = () => {}) {
+    // A tab that is driven counts as seen and focused, if Chromium is not told otherwise.
+    if (!isFirefox) await (await this.tab.createCDPSession()).send('Emulation.setFocusEmulationEnabled', {enabled: false});
+    const other = await this.context.newPage();
+    await other.bringToFront();
+    await until('hidden page', () => this.see(() => document.hidden));
+    await act();
+    await this.tab.bringToFront();
+    await until('page to be seen', () => this.see(() => !document.hidden));
+    await other.close();
+  }
+
+  /** What the browser keeps for the page. */
+  kept() {
+    return this.see(() => localStorage.getItem('quabble'));
+  }
+
+  /** A short Training game, up to the box for a name. */
+  async untilName() {
+    await this.choose(menu.training);
+    await this.move(true);
+    await this.atRest();
+    await this.click(95, 385); // End Game
+    await this.untilWindow('Game Statistics');
+    await this.press('Enter', keys.enter);
+    await this.untilWindow('Best Score');
+  }
+
+  /** Does all that was noted once more on the machine without a screen, where every picture must be the same. */
+  compare(quarters = 4, seed = 7) {
+    const [node, ...options] = [process.execPath, '--no-warnings', '--experimental-wasi-unstable-preview1'];
+    const runner = join(import.meta.dirname, '../../../cmake/run_wasi.mjs');
+    const output = execFileSync(node, [...options, runner, join(build, 'bin/headless_visit'), pictures, `${seed}`, `${quarters}`],
+      {input: this.acts.join('\n') + '\n', encoding: 'utf8'});
+    const expected = output.trim().split('\n').map(Number);
+    const differing = this.pictures.findIndex((picture, i) => picture !== null && picture !== expected[i]);
+    expect(differing < 0 && expected.length === this.pictures.length,
+      `After "${this.acts[differing]}", act ${differing + 1} of ${this.acts.length}, the page shows another picture than the machine without a screen.`);
+  }
+
+  // --- The player ---
+
+  /** The letters of the board, 12 a row: "1" to "4" for blocks, "?" for what is no tile. */
+  async board(isTraining) {
+    const cells = await this.see((top) => window.seen.cells(232, top), isTraining ? 37 : 31);
+    return cells.map((cell) => tiles.get(cell) ?? '?').join('');
+  }
+  async untilBoard(isTraining) {
+    return until('board', async () => {
+      const letters = await this.board(isTraining);
+      return letters.includes('?') ? null : letters;
+    });
+  }
+  /** Clicks a block of the largest cluster; false when there is none of that size. */
+  async move(isTraining, smallest = isTraining ? 2 : 3) {
+    const cluster = largestCluster(await this.untilBoard(isTraining));
+    if (cluster.length < smallest) return false;
+    const cell = cluster[0];
+    await this.click(232 + (cell % 12) * 28 + 14, (isTraining ? 37 : 31) + Math.floor(cell / 12) * 28 + 14);
+    return true;
+  }
+}
+
+/** The places of the blocks in the largest cluster. */
+function largestCluster(letters) {
+  let largest = [];
+  const visited = new Set();
+  for (let start = 0; start < letters.length; ++start) {
+    if (!'1234'.includes(letters[start]) || visited.has(start)) continue;
+    const cluster = [start];
+    visited.add(start);
+    for (const cell of cluster) {
+      const beside = [cell - 12, cell + 12, ...(cell % 12 > 0 ? [cell - 1] : []), ...(cell % 12 < 11 ? [cell + 1] : [])];
+      for (const next of beside) {
+        if (letters[next] !== letters[start] || visited.has(next)) continue;
+        visited.add(next);
+        cluster.push(next);
+      }
+    }
+    if (cluster.length > largest.length) largest = cluster;
+  }
+  return largest;
+}
+
+/** Which letter a cell's fingerprint stands for: the tiles stand in a row at the top of the sheet, a bitmap of 24 bits. */
+const tiles = (() => {
+  const file = readFileSync(join(pictures, 'ALLPICDATA.BMP'));
+  const [start, width, height] = [10, 18, 22].map((at) => file.readInt32LE(at));
+  const stride = (3 * width + 3) & ~3;
+  const found = new Map();
+  [...'.1234SsabcWXYZ'].forEach((letter, tile) => {
+    let hash = 0x811c9dc5;
+    for (let i = 0; i < 28 * 28; ++i) {
+      const at = start + (height - 1 - Math.floor(i / 28)) * stride + 3 * (28 * tile + (i % 28));
+      hash = Math.imul(hash ^ file.readUIntLE(at, 3), 0x01000193);
+    }
+    found.set(hash >>> 0, letter);
+  });
+  return found;
+})();
