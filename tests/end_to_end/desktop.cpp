@@ -134,11 +134,19 @@ void Desktop::clickCloseButton(::Window window) {
 }
 
 void Desktop::press(KeySym keysym, std::chrono::milliseconds howLong) {
-    const KeyCode code = XKeysymToKeycode(display_, keysym);
-    XTestFakeKeyEvent(display_, code, True, CurrentTime);
-    XSync(display_, False);
+    setKey(keysym, true);
     std::this_thread::sleep_for(howLong);
-    XTestFakeKeyEvent(display_, code, False, CurrentTime);
+    setKey(keysym, false);
+}
+
+void Desktop::pressWith(KeySym modifier, KeySym keysym) {
+    setKey(modifier, true);
+    press(keysym);
+    setKey(modifier, false);
+}
+
+void Desktop::setKey(KeySym keysym, bool isDown) {
+    XTestFakeKeyEvent(display_, XKeysymToKeycode(display_, keysym), isDown ? True : False, CurrentTime);
     XSync(display_, False);
 }
 

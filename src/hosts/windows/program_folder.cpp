@@ -31,8 +31,8 @@ std::wstring programPath(std::string_view name) {
     return programFolder() + wideOf(name);
 }
 
-std::vector<std::byte> readProgramFile(std::string_view name) {
-    std::vector<std::byte> bytes;
+FileBytes readProgramFile(std::string_view name) {
+    FileBytes bytes;
     const HANDLE file = CreateFileW(asLongPath(programPath(name)).c_str(), GENERIC_READ, FILE_SHARE_READ,
                                     nullptr, OPEN_EXISTING, 0, nullptr);
     if (file == INVALID_HANDLE_VALUE)

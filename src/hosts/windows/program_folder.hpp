@@ -1,9 +1,9 @@
 #pragma once
 
-#include <cstddef>
 #include <string>
 #include <string_view>
-#include <vector>
+
+#include "platform/front_end.hpp"
 
 namespace quabble {
 
@@ -11,6 +11,6 @@ namespace quabble {
 std::wstring programPath(std::string_view name);
 
 // The whole of a file in it; empty when there is none, it is larger than any of ours, or it cannot be read.
-std::vector<std::byte> readProgramFile(std::string_view name);
+FileBytes readProgramFile(std::string_view name);
 
 }  // namespace quabble

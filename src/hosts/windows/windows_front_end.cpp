@@ -115,7 +115,7 @@ Size WindowsFrontEnd::screenSize() {
     return {GetSystemMetrics(SM_CXSCREEN), GetSystemMetrics(SM_CYSCREEN)};
 }
 
-std::vector<std::byte> WindowsFrontEnd::programFile(std::string_view name) {
+FileBytes WindowsFrontEnd::programFile(std::string_view name) {
     return readProgramFile(name);
 }
 

@@ -29,7 +29,7 @@ class WindowsFrontEnd final : public FrontEnd, private WindowListener {
     void setPointer(WindowId window, PointerShape shape) override;
     void setTextInput(WindowId window, std::optional<Rect> area) override;
     Size screenSize() override;
-    std::vector<std::byte> programFile(std::string_view name) override;
+    FileBytes programFile(std::string_view name) override;
     void openDocument(std::string_view document) override;
     std::string clipboardText() override;
     void setClipboardText(const std::string& text) override;
