@@ -1,12 +1,12 @@
 # Installs the system packages that are missing; to be sourced. Say which group is needed:
-#   need_packages play     to build and start the game
-#   need_packages desktop  to run every check of the desktop game as well
-#   need_packages page     to build the page, and to play in it
-#   need_packages web      to check the page as well
-#   need_packages installer  to build the program for Windows and pack it
-#   need_packages windows  to check it as well
-#   need_packages package  to build the Debian package
-#   need_packages root     to make a fresh system to try things in
+#   need_packages play       to build and start the game
+#   need_packages desktop    to run every check of the desktop game as well
+#   need_packages page       to build the page, and to play in it
+#   need_packages web        to check the page as well
+#   need_packages installer  to build the game for Windows and pack it
+#   need_packages windows    to check it as well
+#   need_packages package    to build the Debian package
+#   need_packages root       to make a fresh system to try things in
 
 say() { printf '%s: %s\n' "${0##*/}" "$*"; }
 fail() {
@@ -34,7 +34,7 @@ packages_of() {
         page) printf '%s' "$page" ;;
         web) printf '%s' "$page libgtest-dev chromium firefox-esr" ;;
         installer) printf '%s' "$installer" ;;
-        windows) printf '%s' "$installer libgtest-dev pkg-config libx11-dev libxtst-dev wine wine64 xvfb openbox" ;;
+        windows) printf '%s' "$installer libgtest-dev pkg-config libx11-dev libxtst-dev wine wine64 xvfb openbox unzip" ;;
         package) printf '%s' "$play dpkg-dev lintian desktop-file-utils appstream man-db groff" ;;
         root) printf 'debootstrap' ;;
     esac

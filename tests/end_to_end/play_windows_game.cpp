@@ -69,6 +69,14 @@ void scales(const Command& command) {
     }
 }
 
+// A few moves, to see that the program works where it lies.
+void shortGame(const Command& command) {
+    Robot robot(command);
+    robot.startProgram();
+    robot.play(GameMode::Training, 3);
+    robot.closeAndCheckExit();
+}
+
 // The user logs off in the midst of a game, with a new score in the table.
 void logOff(const Command& command) {
     Robot robot(command);
@@ -88,6 +96,7 @@ int main(int argc, char** argv) {
         {"games", quabble::games},
         {"windows", quabble::windows},
         {"scales", quabble::scales},
+        {"short_game", quabble::shortGame},
         {"log_off", quabble::logOff}};
     quabble::require(argc == 3 && stories.contains(argv[1]), "usage: play_windows_game STORY PROGRAM");
     stories.at(argv[1])({"wine", argv[2]});
