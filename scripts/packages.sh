@@ -1,11 +1,12 @@
 # Installs the system packages that are missing; to be sourced. Say which group is needed:
-#   need_packages play     to build and start the game
-#   need_packages desktop  to run every check of the desktop game as well
-#   need_packages page     to build the page, and to play in it
-#   need_packages web      to check the page as well
-#   need_packages windows  to check what goes to Windows
-#   need_packages package  to build the Debian package
-#   need_packages root     to make a fresh system to try things in
+#   need_packages play       to build and start the game
+#   need_packages desktop    to run every check of the desktop game as well
+#   need_packages page       to build the page, and to play in it
+#   need_packages web        to check the page as well
+#   need_packages installer  to build the game for Windows and pack it
+#   need_packages windows    to check it as well
+#   need_packages package    to build the Debian package
+#   need_packages root       to make a fresh system to try things in
 
 say() { printf '%s: %s\n' "${0##*/}" "$*"; }
 fail() {
@@ -25,13 +26,15 @@ packages_of() {
     # Node and npm are taken from wherever they are.
     local page="$shared clang-19 lld-19 wasi-libc libc++-19-dev-wasm32 libc++abi-19-dev-wasm32 libclang-rt-19-dev-wasm32"
     page+=" zip xdg-utils$(command -v node >/dev/null || printf ' nodejs')$(command -v npm >/dev/null || printf ' npm')"
+    local installer="$shared g++-mingw-w64-x86-64-posix icoutils nsis zip"
     case "$2" in
         play) printf '%s' "$play" ;;
         desktop) printf '%s' "$play libgtest-dev clang-19 libclang-rt-19-dev clang-format-19 clang-tidy-19 cppcheck valgrind" \
             " apngasm xvfb openbox icewm xdotool x11-xserver-utils libxtst-dev" ;;
         page) printf '%s' "$page" ;;
         web) printf '%s' "$page libgtest-dev chromium firefox-esr" ;;
-        windows) printf '%s' "$shared libgtest-dev g++-mingw-w64-x86-64-posix wine wine64" ;;
+        installer) printf '%s' "$installer" ;;
+        windows) printf '%s' "$installer libgtest-dev pkg-config libx11-dev libxtst-dev wine wine64 xvfb openbox unzip" ;;
         package) printf '%s' "$play dpkg-dev lintian desktop-file-utils appstream man-db groff" ;;
         root) printf 'debootstrap' ;;
     esac

@@ -134,19 +134,19 @@ void Desktop::clickCloseButton(::Window window) {
 }
 
 void Desktop::press(KeySym keysym, std::chrono::milliseconds howLong) {
-    const KeyCode code = XKeysymToKeycode(display_, keysym);
-    XTestFakeKeyEvent(display_, code, True, CurrentTime);
-    XSync(display_, False);
+    setKey(keysym, true);
     std::this_thread::sleep_for(howLong);
-    XTestFakeKeyEvent(display_, code, False, CurrentTime);
-    XSync(display_, False);
+    setKey(keysym, false);
 }
 
-void Desktop::pressWithControl(KeySym keysym) {
-    const KeyCode control = XKeysymToKeycode(display_, XK_Control_L);
-    XTestFakeKeyEvent(display_, control, True, CurrentTime);
+void Desktop::pressWith(KeySym modifier, KeySym keysym) {
+    setKey(modifier, true);
     press(keysym);
-    XTestFakeKeyEvent(display_, control, False, CurrentTime);
+    setKey(modifier, false);
+}
+
+void Desktop::setKey(KeySym keysym, bool isDown) {
+    XTestFakeKeyEvent(display_, XKeysymToKeycode(display_, keysym), isDown ? True : False, CurrentTime);
     XSync(display_, False);
 }
 

@@ -36,7 +36,7 @@ class Desktop {
     // As at the beginning of a drop, of a kind of thing that has no name.
     void offerUnknownDrop(WindowOnScreen window);
     void press(unsigned long keysym, std::chrono::milliseconds howLong = {});
-    void pressWithControl(unsigned long keysym);
+    void pressWith(unsigned long modifier, unsigned long keysym);
 
     void minimise(WindowOnScreen window);
     // As a task bar does; comes back when the window is seen.
@@ -53,6 +53,7 @@ class Desktop {
  private:
     WindowOnScreen find(WindowOnScreen below, const std::string& caption);
     void clickAt(WindowOnScreen window, Point place, int times);  // in the screen's pixels
+    void setKey(unsigned long keysym, bool isDown);
     void askWindowManager(WindowOnScreen window, const char* what, long first);
 
     _XDisplay* display_;

@@ -23,11 +23,11 @@ constexpr int boardLeft = 232;
 
 }  // namespace
 
-RunningGame::RunningGame(Desktop& desktop, std::string program)
-    : desktop_(desktop), program_(std::move(program)) {}
+RunningGame::RunningGame(Desktop& desktop, std::vector<std::string> command)
+    : desktop_(desktop), command_(std::move(command)) {}
 
 void RunningGame::start() {
-    const std::filesystem::path folder = std::filesystem::path(program_).parent_path();
+    const std::filesystem::path folder = std::filesystem::path(command_.back()).parent_path();
     if (desktop_.scale() == Scale()) {
         tiles_ = spritesOf(readPicture(folder / "ALLPICDATA.BMP"), Scale()).tiles;
     } else {
@@ -37,11 +37,19 @@ void RunningGame::start() {
     }
     process_ = fork();
     if (process_ == 0) {
-        execl(program_.c_str(), program_.c_str(), nullptr);
+        std::vector<char*> arguments;
+        for (std::string& word : command_)
+            arguments.push_back(word.data());
+        arguments.push_back(nullptr);
+        execvp(arguments[0], arguments.data());
         _exit(127);
     }
     window_ = desktop_.waitForWindow("Quabble  Ver 1.0");
-    require(look().at(2, 2) == palette::backgroundColour, "a picture from the first");
+    const auto hasPicture = [this] { return look().at(2, 2) == palette::backgroundColour; };
+    if (command_.front() == "wine")  // which puts a window on the screen before what is painted on it
+        waitUntil("a picture", hasPicture);
+    else
+        require(hasPicture(), "a picture from the first");
     desktop_.waitForFocus(window_);
     std::this_thread::sleep_for(500ms);
 }

@@ -4,6 +4,7 @@
 
 #include <array>
 #include <string>
+#include <vector>
 
 #include "desktop.hpp"
 #include "draw/surface.hpp"
@@ -21,7 +22,8 @@ inline Surface partOf(const Surface& picture, const Rect& area) {
 // The program while it runs: its process, its main window and what is to be seen there.
 class RunningGame {
  public:
-    RunningGame(Desktop& desktop, std::string program);
+    // The command's last word is the program's path; its pictures lie beside it.
+    RunningGame(Desktop& desktop, std::vector<std::string> command);
 
     // Comes back when the main menu is there and has the keyboard. The desktop's scale is set before.
     void start();
@@ -42,7 +44,7 @@ class RunningGame {
 
  private:
     Desktop& desktop_;
-    std::string program_;
+    std::vector<std::string> command_;
     std::array<Surface, tiles::count> tiles_;
     pid_t process_ = 0;
     WindowOnScreen window_ = 0;

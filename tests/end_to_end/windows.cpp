@@ -11,220 +11,54 @@
 #include <thread>
 
 #include "../support/files.hpp"
-#include "desktop.hpp"
-#include "gfx/palette.hpp"
 #include "hosts/headless/visit_player.hpp"
-#include "player.hpp"
-#include "running_game.hpp"
+#include "window_stories.hpp"
 
 namespace quabble {
 namespace {
 
 using namespace std::chrono_literals;
 
-class Story {
- public:
-    explicit Story(const std::string& program)
-        : folder_(std::filesystem::path(program).parent_path()), game_(desktop_, program) {
-        game_.start();
+// Of the record that the program is about to write, when it has been played to its end as it says.
+Surface replayedPicture(const std::filesystem::path& pictures) {
+    const std::filesystem::path file =
+        std::filesystem::path(std::getenv("XDG_DATA_HOME")) / "quabble/last_game.visit";
+    std::string text;
+    waitUntil("a whole record",
+              [&] { return (text = bytesOf(file)).find("expect level") != std::string::npos; });
+    std::filesystem::remove(file);
+    const auto read = parseVisit(text);
+    require(std::holds_alternative<Visit>(read), "a record that can be read");
+    const Visit& visit = std::get<Visit>(read);
+    VisitPlayer player(visit, picturesIn(pictures));
+    for (const VisitStep& step : visit.steps) {
+        player.play(step);
+        require(step.kind != VisitStep::Kind::Expect || player.isAsExpected(step), "the same figures");
     }
+    return player.picture();
+}
 
-    void aMinimisedGameStaysAwayAndComesBackPaused(GameMode mode) {
-        game_.begin(mode);
-        for (int time = 0; time < 2; ++time) {
-            desktop_.minimise(game_.window());
-            checkItStaysAway();
-            desktop_.restore(game_.window());
-            resume();
-        }
-        checkTheKeyboardIsAlive();
-        leaveGame();
-    }
-
-    void aKeyInMidMoveHidesTheGame() {
-        game_.begin(GameMode::Strategy);
-        beginMove();
-        desktop_.press(XK_p);
-        waitUntil("the window's leaving", [&] { return !desktop_.isVisible(game_.window()); });
-        checkItStaysAway();
-        desktop_.restore(game_.window());
-        resume();
-        leaveGame();
-        closeDialog("Best Score");
-        closeDialog("Best Scores - Quabble");
-    }
-
-    void theKeyboardComesBackFromAnotherWorkspace() {
-        game_.begin(GameMode::Strategy);
-        desktop_.showWorkspace(1);
+// What was done here is done again without a screen, and the same is seen.
+void theRecordOfAGameIsPlayedAnywhere(const std::string& program) {
+    const std::filesystem::path folder = std::filesystem::path(program).parent_path();
+    WindowStories story({program});
+    story.game().begin(GameMode::Strategy);
+    for (int move = 0; move < 3; ++move) {
+        story.beginMove();
         std::this_thread::sleep_for(1s);
-        desktop_.showWorkspace(0);
-        waitUntil("the window's return", [&] { return desktop_.isVisible(game_.window()); });
-        resume();
-        checkTheKeyboardIsAlive();
-        leaveGame();
     }
-
-    void aDialogKeepsTheKeyboard() {
-        const std::string caption = "Best Scores - Quabble";
-        game_.choose(4);
-        desktop_.waitForFocus(desktop_.waitForWindow(caption));
-        desktop_.click(game_.window(), 20, 280);  // which lies behind it
-        closeDialog(caption);
-        game_.choose(4);
-        desktop_.waitForFocus(desktop_.waitForWindow(caption));
-        desktop_.minimise(game_.window());
-        desktop_.restore(game_.window());
-        closeDialog(caption);
-    }
-
-    void enterClosesOneDialogAPress() {
-        for (const auto held : {0ms, 80ms, 1500ms}) {
-            game_.begin(GameMode::Strategy);
-            beginMove();
-            game_.clickEndGame();
-            closeDialog("Game Statistics");
-            desktop_.waitForFocus(desktop_.waitForWindow("Best Score"));
-            desktop_.press(XK_Return, held);
-            const WindowOnScreen table = desktop_.waitForWindow("Best Scores - Quabble");
-            require(desktop_.isVisible(table), "the table outlives the key that brought it");
-            closeDialog("Best Scores - Quabble");
-        }
-    }
-
-    void aDoubleClickBeginsATrainingGameAndNoMore() {
-        for (int time = 0; time < 4; ++time) {
-            game_.begin(GameMode::Training, 2);
-            std::this_thread::sleep_for(1s);
-            require(game_.readBoard().find('.') == std::string::npos, "a full board");
-            leaveGame();
-        }
-    }
-
-    void aDestroyedDialogWasClosedAndADestroyedMainWindowEndsTheProgram() {
-        game_.begin(GameMode::Strategy);
-        beginMove();
-        game_.clickEndGame();
-        desktop_.destroy(desktop_.waitForWindow("Game Statistics"));
-        desktop_.waitForFocus(desktop_.waitForWindow("Best Score"));
-        desktop_.type("survivor");
-        closeDialog("Best Score");
-        desktop_.waitForWindow("Best Scores - Quabble");
-        desktop_.destroy(game_.window());
-        game_.waitForExit();
-        const std::filesystem::path kept(std::getenv("XDG_DATA_HOME"));
-        require(bytesOf(kept / "quabble/registry.db").find("survivor") != std::string::npos, "kept settings");
-    }
-
-    void aRestoredWindowHasItsPictureAtOnce() {
-        std::this_thread::sleep_for(500ms);  // until the pointer has lit up what it rests on
-        const Surface before = game_.look();
-        desktop_.minimise(game_.window());
-        kill(game_.process(), SIGSTOP);
-        desktop_.restore(game_.window());
-        waitUntil("a picture that the program need not draw again", [&] { return game_.look() == before; });
-        kill(game_.process(), SIGCONT);
-    }
-
-    void anOfferToDropSomethingUnknownDoesNoHarm() {
-        desktop_.offerUnknownDrop(game_.window());
-        game_.begin(GameMode::Training);
-        leaveGame();
-    }
-
-    // What was done here is done again without a screen, and the same is seen.
-    void theRecordOfAGameIsPlayedAnywhere() {
-        game_.begin(GameMode::Strategy);
-        for (int move = 0; move < 3; ++move) {
-            beginMove();
-            std::this_thread::sleep_for(1s);
-        }
-        desktop_.press(XK_Down);
-        std::this_thread::sleep_for(300ms);
-        kill(game_.process(), SIGUSR1);
-        require(replayedPicture() == game_.look(), "the very picture");
-        beginMove();
-        kill(game_.process(), SIGABRT);
-        int status = 0;
-        waitpid(game_.process(), &status, 0);
-        require(WIFSIGNALED(status) && WTERMSIG(status) == SIGABRT, "an end by SIGABRT");
-        require(!replayedPicture().bounds().isEmpty(), "a record of the end, too");
-    }
-
-    void close() {
-        desktop_.clickCloseButton(game_.window());
-        game_.waitForExit();
-    }
-
- private:
-    // Of the record that the program is about to write, when it has been played to its end as it says.
-    Surface replayedPicture() const {
-        const std::filesystem::path file =
-            std::filesystem::path(std::getenv("XDG_DATA_HOME")) / "quabble/last_game.visit";
-        std::string text;
-        waitUntil("a whole record",
-                  [&] { return (text = bytesOf(file)).find("expect level") != std::string::npos; });
-        std::filesystem::remove(file);
-        const auto read = parseVisit(text);
-        require(std::holds_alternative<Visit>(read), "a record that can be read");
-        const Visit& visit = std::get<Visit>(read);
-        VisitPlayer player(visit, picturesIn(folder_));
-        for (const VisitStep& step : visit.steps) {
-            player.play(step);
-            require(step.kind != VisitStep::Kind::Expect || player.isAsExpected(step), "the same figures");
-        }
-        return player.picture();
-    }
-
-    void beginMove() {
-        const std::string before = game_.readBoard();
-        const Choice best = choose(model::read(before));
-        require(best.size > 2, "a cluster to click");
-        const Rect cell = game_.cellAt(best.place.first - 1, best.place.second - 1);
-        desktop_.click(game_.window(), cell.left + 14, cell.top + 14);
-        waitUntil("the move's beginning", [&] { return game_.readBoard() != before; });
-    }
-
-    bool isPaused() { return game_.look().at(2, 2) == palette::pauseBackground; }
-
-    void checkItStaysAway() {
-        const auto end = std::chrono::steady_clock::now() + 1500ms;
-        while (std::chrono::steady_clock::now() < end) {
-            require(!desktop_.isVisible(game_.window()), "a minimised window stays away");
-            std::this_thread::sleep_for(10ms);
-        }
-    }
-
-    void resume() {
-        waitUntil("the pause notice", [&] { return isPaused(); });
-        desktop_.click(game_.window(), 400, 535);
-        waitUntil("the game's going on", [&] { return !isPaused(); });
-    }
-
-    // A key hides the game and pauses it.
-    void checkTheKeyboardIsAlive() {
-        desktop_.waitForFocus(game_.window());
-        desktop_.press(XK_p);
-        waitUntil("the window's leaving", [&] { return !desktop_.isVisible(game_.window()); });
-        desktop_.restore(game_.window());
-        resume();
-    }
-
-    void leaveGame() {
-        game_.clickEndGame();
-        closeDialog("Game Statistics");
-    }
-
-    void closeDialog(const std::string& caption) {
-        desktop_.waitForFocus(desktop_.waitForWindow(caption));
-        desktop_.press(XK_Return);
-        waitUntil("the end of " + caption, [&] { return !desktop_.hasWindow(caption); });
-    }
-
-    std::filesystem::path folder_;  // of the program
-    Desktop desktop_;
-    RunningGame game_;
-};
+    story.desktop().press(XK_Down);
+    std::this_thread::sleep_for(300ms);
+    const pid_t process = story.game().process();
+    kill(process, SIGUSR1);
+    require(replayedPicture(folder) == story.game().look(), "the very picture");
+    story.beginMove();
+    kill(process, SIGABRT);
+    int status = 0;
+    waitpid(process, &status, 0);
+    require(WIFSIGNALED(status) && WTERMSIG(status) == SIGABRT, "an end by SIGABRT");
+    require(!replayedPicture(folder).bounds().isEmpty(), "a record of the end, too");
+}
 
 }  // namespace
 }  // namespace quabble
@@ -232,7 +66,7 @@ class Story {
 int main(int argc, char** argv) {
     using quabble::GameMode;
     quabble::require(argc == 2, "usage: windows PROGRAM");
-    quabble::Story story(argv[1]);
+    quabble::WindowStories story({argv[1]});
     story.aMinimisedGameStaysAwayAndComesBackPaused(GameMode::Strategy);
     story.aMinimisedGameStaysAwayAndComesBackPaused(GameMode::Timed);
     story.aKeyInMidMoveHidesTheGame();
@@ -243,7 +77,7 @@ int main(int argc, char** argv) {
     story.anOfferToDropSomethingUnknownDoesNoHarm();
     story.aRestoredWindowHasItsPictureAtOnce();
     story.close();
-    quabble::Story(argv[1]).theRecordOfAGameIsPlayedAnywhere();
-    quabble::Story(argv[1]).aDestroyedDialogWasClosedAndADestroyedMainWindowEndsTheProgram();
+    quabble::theRecordOfAGameIsPlayedAnywhere(argv[1]);
+    quabble::WindowStories({argv[1]}).aDestroyedDialogWasClosedAndADestroyedMainWindowEndsTheProgram();
     return 0;
 }

@@ -85,30 +85,7 @@ void injectFaults() {
     sqlite3_vfs_register(&vfs, 1);
 }
 
-class CrashTest : public SqliteFixture {
- protected:
-    // Everything that is kept says the same number, which is 0 in a new store.
-    static void fill(Kept& kept, std::int16_t number) {
-        kept.settings.solvingData.setScoreTableIndex(number);
-        for (std::int16_t table = 1; table <= 3; ++table) {
-            kept.table(table).scores.fill(number);
-            kept.table(table).names.fill(number == 0 ? unknownName : "player " + std::to_string(number));
-        }
-    }
-    StoreResult saveNumber(std::int16_t number) {
-        Kept kept;
-        fill(kept, number);
-        return kept.save(registry);
-    }
-    // The number, or -1 when not everything says the same.
-    int loadNumber() {
-        Kept kept, expected;
-        kept.load(registry);
-        const std::int16_t number = kept.settings.solvingData.scoreTableIndex();
-        fill(expected, number);
-        return kept.highScores == expected.highScores ? number : -1;
-    }
-};
+using CrashTest = SqliteFixture;
 
 TEST_F(CrashTest, ASaveThatIsCutOffAnywhereLeavesTheOldSettingsOrTheNew) {
     for (const auto& [old, error] : {std::pair<std::int16_t, int>{1, 0},
@@ -124,11 +101,11 @@ TEST_F(CrashTest, ASaveThatIsCutOffAnywhereLeavesTheOldSettingsOrTheNew) {
             if (old == 0)
                 std::filesystem::remove_all(file.parent_path());
             else
-                saveNumber(old);
+                saveNumber(registry, old);
             status = inChild([&] {
                 injectFaults();
                 faults = {.at = at, .error = error};
-                saveNumber(2);
+                saveNumber(registry, 2);
                 if (faults.isOutOfOrder)
                     return OutOfOrder;
                 return faults.step < at ? Untouched : WentOn;
@@ -137,7 +114,7 @@ TEST_F(CrashTest, ASaveThatIsCutOffAnywhereLeavesTheOldSettingsOrTheNew) {
             if (status != Untouched) {
                 EXPECT_EQ(status, error == 0 ? Died : WentOn);
             }
-            const int kept = loadNumber();
+            const int kept = loadNumber(registry);
             if (status == Untouched || kept != old) {
                 EXPECT_EQ(kept, 2);
             }
@@ -148,15 +125,15 @@ TEST_F(CrashTest, ASaveThatIsCutOffAnywhereLeavesTheOldSettingsOrTheNew) {
 
 TEST_F(CrashTest, OfTwoThatSaveAtOnceTheLastWins) {
     for (int pair = 0; pair < 100; ++pair) {
-        saveNumber(3);
+        saveNumber(registry, 3);
         const pid_t other = fork();
         if (other == 0)
-            _exit(saveNumber(1) == StoreResult::Done ? 0 : 1);
-        EXPECT_EQ(inChild([&] { return saveNumber(2) == StoreResult::Done ? 0 : 1; }), 0);
+            _exit(saveNumber(registry, 1) == StoreResult::Done ? 0 : 1);
+        EXPECT_EQ(inChild([&] { return saveNumber(registry, 2) == StoreResult::Done ? 0 : 1; }), 0);
         int status = -1;
         waitpid(other, &status, 0);
         EXPECT_EQ(status, 0);
-        const int kept = loadNumber();
+        const int kept = loadNumber(registry);
         EXPECT_TRUE(kept == 1 || kept == 2) << kept;
     }
 }
