@@ -45,9 +45,14 @@ export class Program {
    * @param {...any} values
    */
   call(name, ...values) {
+    return this.#attempt(() => this.#exports[name](...values));
+  }
+
+  /** @param {() => any} act */
+  #attempt(act) {
     if (this.#isOver) return undefined;
     try {
-      const result = this.#exports[name](...values);
+      const result = act();
       this.#exports.wake();
       if (this.#failure !== null) throw this.#failure;
       this.#settle();
@@ -67,11 +72,12 @@ export class Program {
    * @param {...any} values
    */
   callWithText(text, name, ...values) {
-    if (this.#isOver) return undefined;
-    const bytes = new TextEncoder().encode(text);
-    const place = this.#exports.textBuffer(bytes.length);
-    new Uint8Array(this.#exports.memory.buffer, place, bytes.length).set(bytes);
-    return this.call(name, ...values);
+    return this.#attempt(() => {
+      const bytes = new TextEncoder().encode(text);
+      const place = this.#exports.textBuffer(bytes.length);
+      this.bytesAt(place, bytes.length).set(bytes);
+      return this.#exports[name](...values);
+    });
   }
 
   /** Saves what should last. */
