@@ -11,6 +11,7 @@ export class Program {
   #exports = /** @type {Exports} */ ({});
   #alarm = 0;
   #isOver = false;
+  #hasClosedWindow = false;
   #failure = /** @type {unknown} */ (null); // of something that the program asked for
   #asked = /** @type {Uint8Array} */ (new Uint8Array());
   /** What was cut or copied last, and what is to be pasted. */
@@ -19,7 +20,7 @@ export class Program {
   /**
    * @param {Files} files
    * @param {Keeping} keeping
-   * @param {{end: () => void, fail: (reason: unknown) => void, open: (document: string) => void}} page
+   * @param {{end: () => void, fail: (reason: unknown) => void, closed: () => void, open: (document: string) => void}} page
    */
   constructor(files, keeping, page) {
     this.files = files;
@@ -95,6 +96,10 @@ export class Program {
     const deadline = this.#exports.nextDeadline();
     if (deadline < Infinity)
       this.#alarm = setTimeout(() => this.call('wake'), Math.max(0, Math.ceil(deadline - performance.now())));
+    if (this.#hasClosedWindow) {
+      this.#hasClosedWindow = false;
+      this.page.closed();
+    }
   }
 
   /** @param {number} at @param {number} size */
@@ -128,7 +133,10 @@ export class Program {
       placeWindow: (window, ...places) => frames.place(window, places),
       showPixels: (window, width, height, pixels) =>
         frames.show(window, width, height, this.bytesAt(pixels, width * height * 4)),
-      closeWindow: (window) => frames.close(window),
+      closeWindow: (window) => {
+        this.#hasClosedWindow = true;
+        frames.close(window);
+      },
       minimiseWindow: (window) => frames.minimise(window),
       setPointer: (window, isHand) => frames.setPointer(window, isHand !== 0),
       setTextField: (window, ...place) => frames.setTextField(window, place),
