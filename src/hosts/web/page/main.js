@@ -30,12 +30,13 @@ function showEnd(sentence) {
 }
 
 /** @param {unknown} reason */
-function fail(reason) {
+function fail(reason, isKept = false) {
   console.error(reason);
+  const scores = isKept ? ' High scores that were entered are kept.' : '';
   showEnd(
     typeof WebAssembly === 'undefined' || typeof DecompressionStream === 'undefined'
       ? 'This browser is too old for Quabble: it lacks WebAssembly or the decompression of data.'
-      : 'Quabble has stopped because something went wrong. High scores that were entered are kept.');
+      : `Quabble has stopped because something went wrong.${scores}`);
 }
 
 /** What decides every board: by chance, or as the address says, to play the same boards again. */
@@ -66,7 +67,8 @@ async function play() {
     end: () =>
       showEnd(keeping.isKept ? 'Quabble has ended. Settings and high scores are kept.'
                      : 'Quabble has ended. Settings and high scores could not be kept.'),
-    fail,
+    fail: (reason) => fail(reason, keeping.isKept),
+    closed: keep, // a name may have been entered, which is not to be lost when something goes wrong later
     open,
   });
   document.addEventListener('visibilitychange', () => {

@@ -11,6 +11,7 @@ export class Program {
   #exports = /** @type {Exports} */ ({});
   #alarm = 0;
   #isOver = false;
+  #hasClosedWindow = false;
   #failure = /** @type {unknown} */ (null); // of something that the program asked for
   #asked = /** @type {Uint8Array} */ (new Uint8Array());
   /** What was cut or copied last, and what is to be pasted. */
@@ -19,7 +20,7 @@ export class Program {
   /**
    * @param {Files} files
    * @param {Keeping} keeping
-   * @param {{end: () => void, fail: (reason: unknown) => void, open: (document: string) => void}} page
+   * @param {{end: () => void, fail: (reason: unknown) => void, closed: () => void, open: (document: string) => void}} page
    */
   constructor(files, keeping, page) {
     this.files = files;
@@ -45,9 +46,14 @@ export class Program {
    * @param {...any} values
    */
   call(name, ...values) {
+    return this.#attempt(() => this.#exports[name](...values));
+  }
+
+  /** @param {() => any} act */
+  #attempt(act) {
     if (this.#isOver) return undefined;
     try {
-      const result = this.#exports[name](...values);
+      const result = act();
       this.#exports.wake();
       if (this.#failure !== null) throw this.#failure;
       this.#settle();
@@ -67,11 +73,12 @@ export class Program {
    * @param {...any} values
    */
   callWithText(text, name, ...values) {
-    if (this.#isOver) return undefined;
-    const bytes = new TextEncoder().encode(text);
-    const place = this.#exports.textBuffer(bytes.length);
-    new Uint8Array(this.#exports.memory.buffer, place, bytes.length).set(bytes);
-    return this.call(name, ...values);
+    return this.#attempt(() => {
+      const bytes = new TextEncoder().encode(text);
+      const place = this.#exports.textBuffer(bytes.length);
+      this.bytesAt(place, bytes.length).set(bytes);
+      return this.#exports[name](...values);
+    });
   }
 
   /** Saves what should last. */
@@ -89,6 +96,10 @@ export class Program {
     const deadline = this.#exports.nextDeadline();
     if (deadline < Infinity)
       this.#alarm = setTimeout(() => this.call('wake'), Math.max(0, Math.ceil(deadline - performance.now())));
+    if (this.#hasClosedWindow) {
+      this.#hasClosedWindow = false;
+      this.page.closed();
+    }
   }
 
   /** @param {number} at @param {number} size */
@@ -122,7 +133,10 @@ export class Program {
       placeWindow: (window, ...places) => frames.place(window, places),
       showPixels: (window, width, height, pixels) =>
         frames.show(window, width, height, this.bytesAt(pixels, width * height * 4)),
-      closeWindow: (window) => frames.close(window),
+      closeWindow: (window) => {
+        this.#hasClosedWindow = true;
+        frames.close(window);
+      },
       minimiseWindow: (window) => frames.minimise(window),
       setPointer: (window, isHand) => frames.setPointer(window, isHand !== 0),
       setTextField: (window, ...place) => frames.setTextField(window, place),
