@@ -12,7 +12,9 @@ struct NamedCommand {
 };
 constexpr std::array namedCommands{
     NamedCommand{"ArrowLeft", EditCommand::Left}, NamedCommand{"ArrowRight", EditCommand::Right},
-    NamedCommand{"Home", EditCommand::Home}, NamedCommand{"End", EditCommand::End},
+    NamedCommand{"ArrowUp", EditCommand::Up},     NamedCommand{"ArrowDown", EditCommand::Down},
+    NamedCommand{"Insert", EditCommand::Click},   NamedCommand{"ContextMenu", EditCommand::Click},
+    NamedCommand{"Home", EditCommand::Home},      NamedCommand{"End", EditCommand::End},
     NamedCommand{"Delete", EditCommand::Delete}};
 
 struct NamedKey {
@@ -23,10 +25,13 @@ constexpr std::array namedKeys{NamedKey{"Enter", keys::enter}, NamedKey{"Escape"
                                NamedKey{"Backspace", keys::backspace}, NamedKey{"Tab", keys::tab}};
 
 std::optional<EditCommand> commandOf(const PageKey& key) {
+    if (key.ctrl && key.key == "Enter")
+        return EditCommand::Click;
+    if (key.ctrl && key.editsText && (key.key == "a" || key.key == "A"))
+        return EditCommand::SelectAll;
     const auto named = std::ranges::find(namedCommands, key.key, &NamedCommand::key);
     if (named == namedCommands.end())
-        return key.ctrl && (key.key == "a" || key.key == "A") ? std::optional(EditCommand::SelectAll)
-                                                              : std::nullopt;
+        return std::nullopt;
     if (key.ctrl && named->command == EditCommand::Left)
         return EditCommand::WordLeft;
     if (key.ctrl && named->command == EditCommand::Right)
@@ -51,10 +56,11 @@ std::optional<std::int16_t> characterOf(std::string_view key) {
 
 std::optional<InputEvent> translate(const PageKey& key) {
     const bool isCommand = (key.ctrl || key.alt) && !key.altGraph;
-    if (key.editsText) {
-        if (const auto command = commandOf(key); command && !key.alt)
-            return InputEvent{.kind = EventKind::Edit, .command = *command, .extends = key.shift};
-    }
+    const auto command = key.alt ? std::nullopt : commandOf(key);
+    if (command == EditCommand::Click && key.isRepeated)
+        return std::nullopt;
+    if (command)
+        return InputEvent{.kind = EventKind::Edit, .command = *command, .extends = key.shift};
     if (isCommand || (key.key == "Tab" && !key.editsText))
         return std::nullopt;
     const auto character = characterOf(key.key);

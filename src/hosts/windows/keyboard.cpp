@@ -17,7 +17,7 @@ bool isCtrlHeld() {
     return isHeld(VK_CONTROL) && !isHeld(VK_MENU);
 }
 
-// What a key asks of a text being edited.
+// What a key asks of a text being edited or of the program's pointer.
 std::optional<EditCommand> commandOf(std::uintptr_t key) {
     const bool ctrl = isCtrlHeld();
     const bool shift = isHeld(VK_SHIFT);
@@ -29,6 +29,14 @@ std::optional<EditCommand> commandOf(std::uintptr_t key) {
             return ctrl ? EditCommand::WordLeft : EditCommand::Left;
         case VK_RIGHT:
             return ctrl ? EditCommand::WordRight : EditCommand::Right;
+        case VK_UP:
+            return EditCommand::Up;
+        case VK_DOWN:
+            return EditCommand::Down;
+        case VK_APPS:
+            return EditCommand::Click;
+        case VK_RETURN:
+            return when(ctrl, EditCommand::Click);
         case VK_HOME:
             return EditCommand::Home;
         case VK_END:
@@ -36,7 +44,7 @@ std::optional<EditCommand> commandOf(std::uintptr_t key) {
         case VK_DELETE:
             return shift ? EditCommand::Cut : EditCommand::Delete;
         case VK_INSERT:
-            return ctrl ? std::optional(EditCommand::Copy) : when(shift, EditCommand::Paste);
+            return ctrl ? EditCommand::Copy : shift ? EditCommand::Paste : EditCommand::Click;
         case 'A':
             return when(ctrl, EditCommand::SelectAll);
         case 'C':
@@ -65,7 +73,7 @@ std::optional<InputEvent> Keyboard::press(std::uintptr_t key, std::intptr_t deta
     if (!isRepeated(details))
         pressed_.set(scanCodeOf(details));
     const auto command = pressed_[scanCodeOf(details)] ? commandOf(key) : std::nullopt;
-    if (!command)
+    if (!command || (command == EditCommand::Click && isRepeated(details)))
         return std::nullopt;
     return InputEvent{.kind = EventKind::Edit, .command = *command, .extends = isHeld(VK_SHIFT)};
 }

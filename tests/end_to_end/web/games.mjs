@@ -73,7 +73,7 @@ export default {
     await goOn();
     await visit.whileHidden();
     await goOn();
-    await visit.tab.keyboard.press('ArrowUp');
+    await visit.tab.keyboard.press('Shift');
     await visit.tab.keyboard.press('F2');
     expect((await visit.board(false)) === board, 'A key that yields no character has paused the game.');
     await visit.close();

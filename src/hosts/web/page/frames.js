@@ -148,15 +148,16 @@ export class Frames {
     }
   }
 
-  /** @param {number} window */
+  /** Returns whether it was a dialog. @param {number} window */
   close(window) {
     const shown = this.#windows.get(window);
-    if (shown === undefined) return;
+    if (shown === undefined) return false;
     this.#windows.delete(window);
     shown.frame.remove();
     this.#letOneTakeInput();
     const owner = this.#windows.get(shown.owner);
     (owner?.field ?? owner?.canvas)?.focus();
+    return shown.owner !== 0;
   }
 
   /** @param {number} window */

@@ -11,7 +11,7 @@ export class Program {
   #exports = /** @type {Exports} */ ({});
   #alarm = 0;
   #isOver = false;
-  #hasClosedWindow = false;
+  #hasClosedDialog = false;
   #failure = /** @type {unknown} */ (null); // of something that the program asked for
   #asked = /** @type {Uint8Array} */ (new Uint8Array());
   /** What was cut or copied last, and what is to be pasted. */
@@ -96,8 +96,8 @@ export class Program {
     const deadline = this.#exports.nextDeadline();
     if (deadline < Infinity)
       this.#alarm = setTimeout(() => this.call('wake'), Math.max(0, Math.ceil(deadline - performance.now())));
-    if (this.#hasClosedWindow) {
-      this.#hasClosedWindow = false;
+    if (this.#hasClosedDialog) {
+      this.#hasClosedDialog = false;
       this.page.closed();
     }
   }
@@ -134,8 +134,7 @@ export class Program {
       showPixels: (window, width, height, pixels) =>
         frames.show(window, width, height, this.bytesAt(pixels, width * height * 4)),
       closeWindow: (window) => {
-        this.#hasClosedWindow = true;
-        frames.close(window);
+        if (frames.close(window)) this.#hasClosedDialog = true;
       },
       minimiseWindow: (window) => frames.minimise(window),
       setPointer: (window, isHand) => frames.setPointer(window, isHand !== 0),
