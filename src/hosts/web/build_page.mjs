@@ -54,7 +54,7 @@ const script = bundle.outputFiles[0].text;
 function fill(links, data, connections) {
   const policy = [
     "default-src 'none'", `script-src ${hashOf(script)} 'wasm-unsafe-eval'`, `style-src ${hashOf(style)}`,
-    'img-src data: blob: ' + connections, `connect-src ${connections}`, `manifest-src ${connections}`, `worker-src ${connections}`,
+    `img-src data: blob: ${connections === "'none'" ? '' : connections}`, `connect-src ${connections}`, `manifest-src ${connections}`, `worker-src ${connections}`,
     "base-uri 'none'", "form-action 'none'",
   ].join('; ');
   const parts = {policy, links, style, data, script};
