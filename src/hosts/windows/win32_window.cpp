@@ -1,12 +1,14 @@
 #include "hosts/windows/win32_window.hpp"
 
 #include <algorithm>
+#include <utility>
 
 #include "hosts/windows/dots.hpp"
 #include "hosts/windows/registry/win32.hpp"
 // after it
 #include <imm.h>
 
+#include "hosts/windows/resource_numbers.hpp"
 #include "hosts/windows/wide_text.hpp"
 #include "hosts/windows/window_procedure.hpp"
 
@@ -24,6 +26,17 @@ Rect outerRectOf(HWND window) {
     RECT outer{};
     GetWindowRect(window, &outer);
     return {outer.left, outer.top, outer.right, outer.bottom};
+}
+
+void setIcons(HWND window) {
+    const auto load = [](int width, int height) {
+        return LoadImageW(GetModuleHandleW(nullptr), MAKEINTRESOURCEW(QUABBLE_ICON), IMAGE_ICON,
+                          GetSystemMetrics(width), GetSystemMetrics(height), LR_DEFAULTCOLOR);
+    };
+    static const HANDLE large = load(SM_CXICON, SM_CYICON);
+    static const HANDLE little = load(SM_CXSMICON, SM_CYSMICON);
+    SendMessageW(window, WM_SETICON, ICON_BIG, reinterpret_cast<LPARAM>(large));
+    SendMessageW(window, WM_SETICON, ICON_SMALL, reinterpret_cast<LPARAM>(little));
 }
 
 // The corner from which a size lies in the middle of an area.
@@ -128,10 +141,12 @@ void Win32Window::resizeTo(Size client) const {
 
 void Win32Window::show(const Surface& picture) {
     picture_.set(picture, sizeAt(factor_));
-    if (!isOpened_)
+    const bool opens = !std::exchange(isOpened_, true);
+    if (opens)
         ShowWindow(handle_, SW_SHOW);
-    isOpened_ = true;
     RedrawWindow(handle_, nullptr, nullptr, RDW_INVALIDATE | RDW_UPDATENOW);
+    if (opens && owner_ == nullptr)
+        setIcons(handle_);  // which takes a while and need not be there before
 }
 
 void Win32Window::paint() const {

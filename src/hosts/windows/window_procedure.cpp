@@ -1,7 +1,6 @@
 #include "hosts/windows/window_procedure.hpp"
 
 #include "hosts/windows/registry/win32.hpp"
-#include "hosts/windows/resource_numbers.hpp"
 #include "hosts/windows/win32_window.hpp"
 
 namespace quabble {
@@ -23,17 +22,10 @@ struct WindowProcedure {
 };
 
 bool registerWindowClass() {
-    const HINSTANCE program = GetModuleHandleW(nullptr);
-    const auto icon = [&](int width, int height) {
-        return static_cast<HICON>(LoadImageW(program, MAKEINTRESOURCEW(QUABBLE_ICON), IMAGE_ICON,
-                                             GetSystemMetrics(width), GetSystemMetrics(height), LR_SHARED));
-    };
     WNDCLASSEXW kind{};
     kind.cbSize = sizeof kind;
     kind.lpfnWndProc = WindowProcedure::call;
-    kind.hInstance = program;
-    kind.hIcon = icon(SM_CXICON, SM_CYICON);
-    kind.hIconSm = icon(SM_CXSMICON, SM_CYSMICON);
+    kind.hInstance = GetModuleHandleW(nullptr);
     kind.lpszClassName = windowClassName;
     return RegisterClassExW(&kind) != 0;
 }
