@@ -9,7 +9,7 @@ import {serve, addressOf} from '../src/hosts/web/serve.mjs';
 
 const [page, tools, splash] = process.argv.slice(2).map((path) => resolve(path));
 const puppeteer = createRequire(tools + '/')('puppeteer-core');
-const starts = Number(process.env.STARTS ?? 15);
+const starts = 15;
 const browser = await puppeteer.launch({
   executablePath: '/usr/bin/chromium', headless: true,
   args: ['--no-sandbox', '--disable-gpu', '--disable-quic', '--no-first-run', '--disable-background-networking',
