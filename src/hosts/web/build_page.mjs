@@ -10,7 +10,7 @@ import * as esbuild from 'esbuild';
 
 const [filesFolder, out] = process.argv.slice(2);
 const page = join(import.meta.dirname ?? new URL('.', import.meta.url).pathname, 'page');
-const pictures = ['ALLPICDATA.BMP', 'BGIMG.BMP'];
+const pictures = ['ALLPICDATA.BMP'];
 const largePictures = ['ALLPICDATA.BIG', 'BGIMG.BIG'];
 const helpPage = 'QB_HELP.HTM';
 const icons = [192, 512];
@@ -49,15 +49,18 @@ const bundle = await esbuild.build({
   entryPoints: [join(page, 'main.js')], bundle: true, minify: true, format: 'esm', target: 'es2022', charset: 'ascii', write: false,
 });
 const script = bundle.outputFiles[0].text;
+const {code: early} = await esbuild.transform(readFileSync(join(page, 'early.js'), 'utf8'), {minify: true, charset: 'ascii'});
+const splash = readFileSync(join(filesFolder, 'BGIMG.PNG'));
+const asData = (png) => `data:image/png;base64,${png.toString('base64')}`;
 
-/** @param {string} links @param {string} data @param {string} connections what may be fetched from */
-function fill(links, data, connections) {
+/** @param {string} source where the page's own files are taken from, in the words of a policy */
+function fill(links, data, splash, source) {
   const policy = [
-    "default-src 'none'", `script-src ${hashOf(script)} 'wasm-unsafe-eval'`, `style-src ${hashOf(style)}`,
-    `img-src data: blob: ${connections === "'none'" ? '' : connections}`, `connect-src ${connections}`, `manifest-src ${connections}`, `worker-src ${connections}`,
-    "base-uri 'none'", "form-action 'none'",
+    "default-src 'none'", `script-src ${hashOf(early)} ${hashOf(script)} 'wasm-unsafe-eval'`, `style-src ${hashOf(style)}`,
+    `img-src data: ${source}`, `connect-src ${source || 'data:'}`, `manifest-src ${source || "'none'"}`,
+    `worker-src ${source || "'none'"}`, "base-uri 'none'", "form-action 'none'",
   ].join('; ');
-  const parts = {policy, links, style, data, script};
+  const parts = {policy, links, style, splash, early, data, script};
   return template.replace(/\{\{(\w+)\}\}/g, (_, name) => parts[name]);
 }
 
@@ -71,7 +74,8 @@ const siteLinks = [
   '<link rel="manifest" href="manifest.webmanifest">', '<link rel="icon" href="icon_192.png">',
 ];
 const siteFiles = {
-  'index.html': fill(siteLinks.join('\n'), '', "'self'"),
+  'index.html': fill(siteLinks.join('\n'), '', 'splash.png', "'self'"),
+  'splash.png': splash,
   'program.data': program,
   'pictures.data': pack(pictures),
   'rest.data': pack(largePictures),
@@ -97,5 +101,5 @@ for (const [name, content] of Object.entries(siteFiles)) writeFileSync(join(site
 
 const inside = {program, pictures: pack(pictures), rest: pack([...largePictures, helpPage])};
 const data = Object.entries(inside).map(([name, bytes]) => `<script type="text/plain" id="${name}">${asText(bytes)}</script>`);
-const inlineIcon = `<link rel="icon" href="data:image/png;base64,${readFileSync(join(filesFolder, 'icon_64.png')).toString('base64')}">`;
-writeFileSync(join(out, 'quabble.html'), fill(inlineIcon, data.join('\n'), "'none'"));
+const inlineIcon = `<link rel="icon" href="${asData(readFileSync(join(filesFolder, 'icon_64.png')))}">`;
+writeFileSync(join(out, 'quabble.html'), fill(inlineIcon, data.join('\n'), asData(splash), ''));

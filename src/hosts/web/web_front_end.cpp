@@ -4,6 +4,8 @@
 #include <chrono>
 #include <cstdlib>
 
+#include "draw/bitmap_file.hpp"
+#include "draw/png_file.hpp"
 #include "draw/scaling.hpp"
 #include "hosts/web/page.hpp"
 
@@ -12,6 +14,12 @@ namespace {
 
 std::uint32_t number(WindowId window) {
     return static_cast<std::uint32_t>(window);
+}
+
+FileBytes pageFile(std::string_view name) {
+    FileBytes bytes(page::fileSize(name.data(), name.size()));
+    page::take(bytes.data());
+    return bytes;
 }
 
 }  // namespace
@@ -183,10 +191,15 @@ void WebFrontEnd::setClipboardText(const std::string& text) {
 
 // --- Files ---
 
+// The page has the backdrop as a PNG picture, for it shows it by itself until the program does.
 FileBytes WebFrontEnd::programFile(std::string_view name) {
-    FileBytes bytes(page::fileSize(name.data(), name.size()));
-    page::take(bytes.data());
-    return bytes;
+    constexpr std::string_view backdrop = "BGIMG.BMP";
+    FileBytes bytes = pageFile(name == backdrop ? "BGIMG.PNG" : name);
+    if (name != backdrop)
+        return bytes;
+    const auto picture = decodePng(bytes);
+    const auto bitmap = picture ? encodeBitmap(*picture) : std::vector<std::byte>();
+    return {bitmap.begin(), bitmap.end()};
 }
 
 void WebFrontEnd::openDocument(std::string_view document) {

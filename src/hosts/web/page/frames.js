@@ -144,6 +144,7 @@ export class Frames {
     paint.putImageData(new ImageData(bytes, width), 0, 0);
     if (!frame.classList.contains('seen')) {
       frame.classList.add('seen');
+      document.getElementById('splash')?.remove();
       (shown.field ?? canvas).focus();
     }
   }

@@ -3,7 +3,7 @@
 import {Frames} from './frames.js';
 import {showHelp} from './help.js';
 import {Keeping} from './keeping.js';
-import {filesOf, isOneFile, program as loadProgram} from './parts.js';
+import {backdrop, filesOf, isOneFile, program as loadProgram} from './parts.js';
 import {Program} from './program.js';
 
 const helpPage = 'QB_HELP.HTM';
@@ -54,7 +54,8 @@ function open(document) {
 async function play() {
   const keeping = new Keeping();
   const isOpened = keeping.open();
-  const [module, files] = await Promise.all([loadProgram(), filesOf('pictures')]);
+  const [module, files, picture] = await Promise.all([loadProgram(), filesOf('pictures'), backdrop()]);
+  files.set('BGIMG.PNG', picture);
   let isTold = false;
   /** Said once. */
   const keep = () => {

@@ -24,6 +24,15 @@ export function filesOf(pack) {
 }
 
 /**
+ * The picture that the page shows until the program does.
+ * @returns {Promise<Uint8Array>}
+ */
+export function backdrop() {
+  const splash = /** @type {HTMLImageElement} */ (document.getElementById('splash'));
+  return twice(async () => new Uint8Array(await (await fetch(splash.src, {cache: 'force-cache'})).arrayBuffer()));
+}
+
+/**
  * A connection that fails once gets a second chance.
  * @template T
  * @param {() => Promise<T>} load
