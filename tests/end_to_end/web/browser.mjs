@@ -46,8 +46,11 @@ export function newFolder() {
 }
 export const removeFolders = () => folders.forEach((folder) => rmSync(folder, {recursive: true, force: true}));
 
-/** A browser of its own; without cookies it lets no page keep anything. */
-export function launch({cookies = true} = {}) {
+/**
+ * A browser of its own; without cookies it lets no page keep anything. With a ratio it believes to be on such a screen,
+ * which is another thing in Chromium than to play one: only then whole device pixels are what it counts in.
+ */
+export function launch({cookies = true, ratio} = {}) {
   if (isFirefox) {
     return puppeteer.launch({
       browser: 'firefox', executablePath: '/usr/bin/firefox-esr', headless: true,
@@ -61,8 +64,9 @@ export function launch({cookies = true} = {}) {
     writeFileSync(join(profile, 'Default', 'Preferences'), JSON.stringify(preferences));
   }
   return puppeteer.launch({
-    executablePath: '/usr/bin/chromium', headless: true, userDataDir: profile,
-    args: ['--no-sandbox', '--disable-gpu', '--disable-quic', '--no-first-run', '--disable-background-networking',
+    executablePath: '/usr/bin/chromium', headless: true, userDataDir: profile, ...(ratio && {defaultViewport: null}),
+    args: [...(ratio ? [`--force-device-scale-factor=${ratio}`] : []),
+      '--no-sandbox', '--disable-gpu', '--disable-quic', '--no-first-run', '--disable-background-networking',
       '--disable-component-update', '--disable-sync'],
   });
 }
@@ -77,15 +81,18 @@ export async function serveSite(folder = join(pageFolder, 'site')) {
 function watch() {
   const alarms = new Set();
   const {setTimeout: set, clearTimeout: clear} = window;
-  const seen = {alarms, frames: 0};
+  const seen = {alarms, calls: 0}; // how often something was asked for that runs by itself
   window.setTimeout = (act, ...rest) => {
     const alarm = set(() => (alarms.delete(alarm), act()), ...rest);
     alarms.add(alarm);
+    ++seen.calls;
     return alarm;
   };
   window.clearTimeout = (alarm) => (alarms.delete(alarm), clear(alarm));
-  const {requestAnimationFrame: request} = window;
-  window.requestAnimationFrame = (act) => (++seen.frames, request(act));
+  for (const name of ['requestAnimationFrame', 'requestIdleCallback', 'setInterval']) {
+    const ask = window[name];
+    window[name] = (...values) => (++seen.calls, ask(...values));
+  }
   if (window.WebAssembly) {
     const make = WebAssembly.instantiate;
     WebAssembly.instantiate = async (module, imports) => {
@@ -127,12 +134,21 @@ export class Visit {
     visit.watchTab(visit.tab);
     width ??= desktop.width;
     height ??= desktop.height;
-    await visit.tab.setViewport({width, height, deviceScaleFactor: ratio ?? desktop.ratio, ...(touch && {hasTouch: true})});
+    await visit.resize(width, height, ratio ?? desktop.ratio, touch);
     await visit.tab.evaluateOnNewDocument(watch);
     if (before) await visit.tab.evaluateOnNewDocument(before);
     await visit.tab.goto(`${address}#seed=${seed}`);
     if (until === 'menu') await visit.untilMenu();
     return visit;
+  }
+
+  /** The page of a Chromium that believes to be on another screen is as large as its window has room for. */
+  async resize(width, height, ratio, touch = false) {
+    const isReal = this.tab.viewport() === null && !isFirefox;
+    if (!isReal) return this.tab.setViewport({width, height, deviceScaleFactor: ratio, ...(touch && {hasTouch: true})});
+    const session = await this.tab.createCDPSession();
+    const {windowId} = await session.send('Browser.getWindowForTarget');
+    await session.send('Browser.setWindowBounds', {windowId, bounds: {width, height}});
   }
 
   watchTab(tab) {

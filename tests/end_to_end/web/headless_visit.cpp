@@ -48,7 +48,7 @@ std::uint32_t fingerprint(const Surface& picture) {
     return hash;
 }
 
-void act(ScriptedUser<Program>& user, const std::string& line) {
+void act(ScriptedUser<Program>& user, HeadlessFrontEnd& frontEnd, const std::string& line) {
     std::istringstream words(line);
     std::string what;
     words >> what >> std::ws;
@@ -66,6 +66,10 @@ void act(ScriptedUser<Program>& user, const std::string& line) {
         std::int16_t key = 0;
         words >> key;
         user.press(key);
+    } else if (what == "scale") {
+        int quarters = 0;
+        words >> quarters;
+        frontEnd.rescale(Scale::ofQuarters(quarters));
     }
 }
 
@@ -85,7 +89,7 @@ int main(int argc, char** argv) {
     program.start();
     user.wait(std::chrono::minutes(1));  // until the main menu is there
     for (std::string line; std::getline(std::cin, line);) {
-        act(user, line);
+        act(user, frontEnd, line);
         user.wait(std::chrono::minutes(1));
         std::cout << fingerprint(user.top().picture) << '\n';
     }
