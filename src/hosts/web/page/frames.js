@@ -275,9 +275,12 @@ export class Frames {
       field.setSelectionRange(1, 1);
     };
     empty();
+    let half = ''; // of a character that Firefox reports in two halves
     /** @param {string | null} text */
     const type = (text) => {
-      if (text) this.#program.callWithText(text, 'typeText', window);
+      const whole = half + (text ?? '');
+      half = /^[\uD800-\uDBFF]$/.test(whole) ? whole : '';
+      if (whole !== half) this.#program.callWithText(whole, 'typeText', window);
     };
     field.addEventListener('beforeinput', (event) => {
       if (event.isComposing || event.inputType === 'insertCompositionText') return;
