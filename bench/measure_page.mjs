@@ -16,7 +16,7 @@ const browser = await puppeteer.launch({
     '--disable-component-update', '--disable-sync'],
 });
 
-const median = (values) => values.toSorted((one, other) => one - other)[values.length >> 1];
+const median = (values) => [...values].sort((one, other) => one - other)[values.length >> 1];
 
 /** A line of the table whose head bench/run prints. */
 function report(what, measured, limit, unit, {times = 1, more = 0} = {}) {
