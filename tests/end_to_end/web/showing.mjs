@@ -14,6 +14,7 @@ async function differingPixels(visit) {
   });
   const screen = PNG.sync.read(Buffer.from(await visit.tab.screenshot()));
   const canvas = PNG.sync.read(Buffer.from(painted, 'base64'));
+  if (screen.width < Math.round(left) + width || screen.height < Math.round(top) + height) return width * height;
   let differing = 0;
   for (let y = 0; y < height; ++y) {
     for (let x = 0; x < width; ++x) {
