@@ -168,7 +168,7 @@ export class Frames {
     shown.frame.hidden = true;
     const button = document.createElement('button');
     button.className = 'minimised';
-    button.textContent = shown.caption;
+    button.textContent = `Show ${shown.caption}`;
     button.addEventListener('click', () => {
       button.remove();
       shown.frame.hidden = false;
