@@ -3,9 +3,14 @@
 
 /** @param {string} page */
 export function showHelp(page) {
-  const help = new DOMParser().parseFromString(page.replaceAll(' style="', ' data-style="'), 'text/html');
+  let rules = '';
+  const plain = page.replaceAll(' style="', ' data-style="').replace(/<style>(.*?)<\/style>/gs, (_, inside) => {
+    rules += inside;
+    return '';
+  });
+  const help = new DOMParser().parseFromString(plain, 'text/html'); // under the same policy
   const sheet = new CSSStyleSheet();
-  sheet.replaceSync([...help.querySelectorAll('style')].map((style) => style.textContent).join('\n'));
+  sheet.replaceSync(rules);
   for (const element of /** @type {NodeListOf<HTMLElement>} */ (help.querySelectorAll('[data-style]')))
     element.style.cssText = element.dataset.style ?? '';
   for (const link of help.querySelectorAll('a')) link.rel = 'noopener';
