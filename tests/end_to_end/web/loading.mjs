@@ -24,6 +24,7 @@ async function tabOf(visit, act) {
 async function checkHelp(visit) {
   const tab = await tabOf(visit, () => visit.choose(menu.help));
   visit.watchTab(tab);
+  await tab.reload(); // what it had to complain of at first nobody has heard
   await until('help page', async () => (await tab.title()) === 'How to play Quabble');
   const {pictures, isAlone, isStyled} = await tab.evaluate(async () => {
     const images = [...document.images];

@@ -120,6 +120,16 @@ export default {
     const [callsAfter, scriptAfter] = await measure();
     expect(callsAfter === calls, `In ten idle seconds ${callsAfter - calls} alarms or frames were asked for.`);
     expect(scriptAfter - script < 0.01, `In ten idle seconds script ran for ${scriptAfter - script} seconds.`);
+    await visit.click(95, 385); // End Game
+    await visit.untilWindow('Game Statistics');
+    await visit.tab.keyboard.press('Enter');
+    await until('menu', async () => (await visit.captions()).length === 1);
+    await visit.choose(menu.timed);
+    await visit.untilBoard(false);
+    const [callsInGame] = await measure();
+    await wait(3000);
+    const wakes = (await measure())[0] - callsInGame;
+    expect(wakes > 0 && wakes < 30, `In three seconds of a Timed game there were ${wakes} alarms.`);
     await visit.close();
   },
 };
