@@ -3,7 +3,9 @@
 #include <algorithm>
 #include <string>
 
+#include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
+#include "gfx/spoken_words.hpp"
 #include "gfx/string_table.hpp"
 
 namespace quabble {
@@ -33,7 +35,11 @@ void ButtonPanel::drawBox(Canvas& canvas, std::size_t box) const {
     if (looks_[box] != Look::Resting)
         shadow = isHovered ? hoveredShadow : leftShadow;
     drawLabelledBox(canvas, boxes_[box], isHovered ? BoxStyle::Framed : BoxStyle::Plain, isHovered, shadow,
-                    loadString(static_cast<std::uint16_t>(captionBase_ + box + 1)));
+                    captionOf(box));
+}
+
+std::string_view ButtonPanel::captionOf(std::size_t box) const {
+    return loadString(static_cast<std::uint16_t>(captionBase_ + box + 1));
 }
 
 void ButtonPanel::drawValue(Canvas& canvas, std::size_t box, std::int32_t value, bool highlighted) const {
@@ -52,13 +58,18 @@ std::optional<std::size_t> ButtonPanel::buttonAt(float x, float y) const {
     return std::nullopt;
 }
 
-std::vector<Rect> ButtonPanel::places() const {
-    std::vector<Rect> places;
-    for (const ScreenButton& box : boxes_) {
-        if (box.active == BoxKind::Button)
-            places.push_back(box.rect());
+std::vector<Place> ButtonPanel::places() const {
+    std::vector<Place> places;
+    for (std::size_t box = 0; box < boxes_.size(); ++box) {
+        if (boxes_[box].active == BoxKind::Button)
+            places.push_back({boxes_[box].rect(), Place::Role::Button, std::string(captionOf(box))});
     }
     return places;
+}
+
+Place ButtonPanel::valuePlace(std::size_t box, std::int32_t value) const {
+    return {boxes_[box].rect(), Place::Role::Text,
+            fillText(spoken::figure, {"|1", captionOf(box - 1), "|2", value})};
 }
 
 bool ButtonPanel::highlightNext(Canvas& canvas, float x, float y) {

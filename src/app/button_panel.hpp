@@ -9,6 +9,7 @@
 
 #include "draw/canvas.hpp"
 #include "gfx/screen_button.hpp"
+#include "platform/place.hpp"
 
 namespace quabble {
 
@@ -29,14 +30,17 @@ class ButtonPanel {
     // Which button, of the buttons alone, counted from 0, is at that place.
     std::optional<std::size_t> buttonAt(float x, float y) const;
 
-    // Where its buttons are.
-    std::vector<Rect> places() const;
+    // Its buttons.
+    std::vector<Place> places() const;
+    // A value box in words, with the label above it.
+    Place valuePlace(std::size_t box, std::int32_t value) const;
 
     // The next button that is not drawn as the pointer's place asks for is drawn so. False when all are.
     bool highlightNext(Canvas& canvas, float x, float y);
 
  private:
     enum class Look { Resting, Hovered, Left };
+    std::string_view captionOf(std::size_t box) const;
     void drawBox(Canvas& canvas, std::size_t box) const;
 
     std::vector<ScreenButton> boxes_;

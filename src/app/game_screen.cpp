@@ -1,9 +1,13 @@
 #include "app/game_screen.hpp"
 
+#include <algorithm>
+#include <iterator>
 #include <utility>
 
 #include "app/layout.hpp"
+#include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
+#include "gfx/spoken_words.hpp"
 #include "gfx/string_table.hpp"
 
 namespace quabble {
@@ -52,15 +56,36 @@ Rect GameScreen::strip() const {
     return {previewBox_.left, previewBox_.top, previewBox_.cell(12, 0).left, previewBox_.cell(0, 1).top};
 }
 
-std::vector<Rect> GameScreen::places() const {
-    std::vector<Rect> places = panel().places();
-    for (std::int32_t row = 0; row < app_.game.grid.gridRows(); ++row) {
-        for (std::int32_t column = 0; column < app_.game.grid.gridCols(); ++column)
-            places.push_back(boardBox_.cell(column, row));
+std::vector<Place> GameScreen::places() const {
+    std::vector<Place> places{panel().valuePlace(layout::scoreBox, figures_.score),
+                              panel().valuePlace(layout::bestScoreBox, figures_.bestScore)};
+    const bool isArcade = shown_ == Shown::ArcadeGame;
+    if (isArcade) {
+        places.push_back(panel().valuePlace(layout::levelBox, figures_.level));
+        places.push_back({gaugeBox_, Place::Role::Text, rowsInWords()});
+        places.push_back({strip(), Place::Role::Text, waitingRowInWords()});
     }
-    if (shown_ == Shown::ArcadeGame)
-        places.push_back(strip());
+    std::ranges::move(panel().places(), std::back_inserter(places));
+    std::ranges::move(boardPlaces(boardBox_, app_.game.grid), std::back_inserter(places));
+    if (isArcade)
+        places.push_back({strip(), Place::Role::Button, std::string(spoken::bringRow)});
     return places;
+}
+
+std::string GameScreen::rowsInWords() const {
+    const std::int16_t level = std::clamp<std::int16_t>(app_.game.stats.level, 1, lastLevel);
+    return fillText(spoken::rows, {"|1", app_.game.rowsEntered, "|2", app_.levelTable[level].rowsToComplete});
+}
+
+std::string GameScreen::waitingRowInWords() const {
+    std::string cells;
+    for (const GridCell& cell : app_.game.nextRow)
+        cells += (cells.empty() ? "" : ", ") + wordsFor(cell);
+    return fillText(spoken::waitingRow, {"|1", revealed_ + 1, "|2", cells});
+}
+
+void GameScreen::say(std::string_view words) {
+    loop_.frontEnd().say(words);
 }
 
 void GameScreen::highlightUnderPointer(float x, float y) {
@@ -162,6 +187,7 @@ void GameScreen::drawPoints(CellPosition place, std::int32_t points) {
 void GameScreen::updateScore() {
     if (!app_.game.isGameActive())
         return;
+    say(fillText(spoken::points, {"|1", app_.game.stats.score - figures_.score}));
     figures_.score = app_.game.stats.score;
     panel().drawValue(window_.canvas(), layout::scoreBox, figures_.score, false);
 }
@@ -170,6 +196,7 @@ void GameScreen::displayLevel() {
     figures_.level = app_.game.stats.level;
     figures_.isLevelHighlighted = true;
     panel().drawValue(window_.canvas(), layout::levelBox, figures_.level, true);
+    say(fillText(spoken::level, {"|1", figures_.level}));
 }
 
 void GameScreen::drawPreviewRow(std::int16_t revealed) {
@@ -178,6 +205,8 @@ void GameScreen::drawPreviewRow(std::int16_t revealed) {
 }
 
 void GameScreen::drawGauge(double percentage) {
+    if (percentage > percentage_)
+        say(rowsInWords());
     percentage_ = percentage;
     quabble::drawGauge(window_.canvas(), gaugeBox_, sprites(), percentage);
 }
@@ -209,6 +238,8 @@ Task<> GameScreen::showResult(bool goNextLevel) {
 }
 
 Task<std::string> GameScreen::enterName() {
+    const std::int16_t place = app_.highScores.rankOf(app_.game.scoreTableIndex, app_.game.stats.score);
+    say(fillText(spoken::place, {"|1", place}));
     co_await loop_.showModal(diagUN_);
     co_return diagUN_.nameEntered();
 }

@@ -41,8 +41,8 @@ class GameScreen final : public Stage {
     // Whether the place is on the strip of the waiting row, which only an arcade game has.
     bool isOnPreview(float x, float y) const;
     void highlightUnderPointer(float x, float y);
-    // The panel's buttons, the board's cells and the strip of the game that is on the screen.
-    std::vector<Rect> places() const;
+    // The figures, the panel's buttons, the board's cells and the strip of the game that is on the screen.
+    std::vector<Place> places() const;
 
     // Paints all that was drawn for the game that is on the screen once more, as it is outside a move.
     void paint();
@@ -79,6 +79,9 @@ class GameScreen final : public Stage {
     void clear();
     void drawPanel();
     void drawValues();
+    std::string rowsInWords() const;
+    std::string waitingRowInWords() const;
+    void say(std::string_view words);
 
     MessageLoop& loop_;
     Window& window_;

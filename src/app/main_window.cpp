@@ -3,6 +3,7 @@
 #include "app/layout.hpp"
 #include "app/store_message.hpp"
 #include "base/round_half_even.hpp"
+#include "gfx/spoken_words.hpp"
 #include "gfx/string_table.hpp"
 #include "store/version.hpp"
 
@@ -78,11 +79,11 @@ void MainWindow::Form_Resize() {
         enablePause(true);
 }
 
-int MainWindow::screen() const {
-    enum { Menu, Game, PausedGame };
+std::string MainWindow::screenName() const {
     if (app_.game.mainMenuActive)
-        return Menu;
-    return isPaused() ? PausedGame : Game;
+        return std::string(spoken::mainMenu);
+    return std::string(isPaused() ? spoken::paused
+                                  : spoken::games[static_cast<std::size_t>(app_.game.gameMode)]);
 }
 
 bool MainWindow::isClickable(float x, float y) const {
@@ -91,7 +92,7 @@ bool MainWindow::isClickable(float x, float y) const {
     return app_.game.isGameActive() && (screen_.buttonAt(x, y) || screen_.isOnPreview(x, y));
 }
 
-std::vector<Rect> MainWindow::places() const {
+std::vector<Place> MainWindow::places() const {
     return app_.game.mainMenuActive ? mmBtns_.places() : screen_.places();
 }
 

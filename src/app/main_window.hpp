@@ -33,9 +33,9 @@ class MainWindow final : public Window {
     Task<> Form_MouseDown(float x, float y) override;
     Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;
-    int screen() const override;
+    std::string screenName() const override;
     bool isClickable(float x, float y) const override;
-    std::vector<Rect> places() const override;
+    std::vector<Place> places() const override;
     Task<> mainMenuClick(float x, float y);
     Task<> gameClick(float x, float y);
     Task<> gameMenuClick(PanelButton button);

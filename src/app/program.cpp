@@ -45,6 +45,12 @@ std::optional<WindowId> Program::modalWindow() const {
     return window == nullptr ? std::nullopt : std::optional(window->id());
 }
 
+const Window* Program::topmostWindow() const {
+    if (const Window* window = loop_.modalWindow())
+        return window;
+    return frmQuabble_ && frmQuabble_->isShown() ? frmQuabble_.get() : nullptr;
+}
+
 // Before the main window is there nothing has changed, and when it closed everything was saved.
 bool Program::keep() {
     return !frmQuabble_ || !frmQuabble_->isShown() || state_.save() == StoreResult::Done;
@@ -61,9 +67,7 @@ bool Program::requestEnd() {
 void Program::record(const InputEvent& event) {
     if (state_.game.mainMenuActive && frmQuabble_ && loop_.modalWindow() == nullptr && loop_.isIdle())
         beginRecord(true);
-    const Window* topmost = loop_.modalWindow();
-    if (topmost == nullptr)
-        topmost = frmQuabble_.get();
+    const Window* topmost = topmostWindow();
     const bool isTopmost = topmost != nullptr && event.window == topmost->id();
     const bool isBelow = !isTopmost && frmQuabble_ && event.window == frmQuabble_->id();
     if (isTopmost || isBelow)

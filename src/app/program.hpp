@@ -39,6 +39,11 @@ class Program {
     // The window that takes all input, while the others take none; without one they all do.
     std::optional<WindowId> modalWindow() const;
 
+    // The window that was opened last; null when none is there.
+    const Window* topmostWindow() const;
+    // How many pictures windows have shown up to now.
+    std::uint64_t picturesShown() const { return loop_.picturesShown(); }
+
     // Saves what should last; nothing is shown and the program goes on. False when it could not be kept. For
     // machines that may stop the program without a word.
     bool keep();

@@ -40,6 +40,10 @@ void Splash::Form_Paint() {
     drawShadowText(canvas(), tagline_, 2, loadString(string_ids::tagline), defaultTextFormat);
 }
 
+std::vector<Place> Splash::places() const {
+    return {{tagline_.rect().shrunkBy(-6), Place::Role::Link, std::string(loadString(string_ids::tagline))}};
+}
+
 // The first tick is a good time to make ready what the games are drawn with.
 Task<> Splash::splashTimer_Timer() {
     pictures_.sprites(canvas().scale());

@@ -21,7 +21,7 @@ class Splash final : public Window {
     void Form_Paint() override;
     bool isClickable(float x, float y) const override { return hitTest(tagline_, x, y); }
     // The text stands at the area's upper edge.
-    std::vector<Rect> places() const override { return {tagline_.rect().shrunkBy(-6)}; }
+    std::vector<Place> places() const override;
     Task<> Form_MouseDown(float x, float y) override;
     Task<> splashTimer_Timer();
 

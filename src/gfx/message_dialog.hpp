@@ -18,8 +18,6 @@ class MessageDialog final : public OkDialog {
     void Form_Paint() override;
 
     std::string title_;  // UTF-8
-    std::string text_;   // Windows-1252
-    ScreenButton label_;
 };
 
 }  // namespace quabble

@@ -12,6 +12,7 @@ class TemplateArgument {
  public:
     TemplateArgument(const char* text) : text_(text) {}
     TemplateArgument(std::string text) : text_(std::move(text)) {}
+    TemplateArgument(std::string_view text) : text_(text) {}
     TemplateArgument(std::int32_t number) : text_(std::to_string(number)) {}
     const std::string& text() const { return text_; }
 

@@ -16,6 +16,10 @@ ScreenButton layOutOkButton(std::int32_t left, std::int32_t top) {
             .font = {Typeface::Sans, 14}};
 }
 
+Place okPlace(const ScreenButton& button) {
+    return {button.rect(), Place::Role::Button, std::string(loadString(string_ids::ok))};
+}
+
 void drawOkButton(Canvas& canvas, const ScreenButton& button) {
     const BoxStyle style = button.hovered ? BoxStyle::DoubleFramed : BoxStyle::Framed;
     drawLabelledBox(canvas, button, style, button.hovered, button.hovered ? 8 : 6,

@@ -1,8 +1,15 @@
 #include "gfx/ok_dialog.hpp"
 
 #include "gfx/ok_button.hpp"
+#include "gfx/spoken_words.hpp"
 
 namespace quabble {
+
+std::vector<Place> OkDialog::places() const {
+    std::vector<Place> places = textPlaces(textBox_.rect(), text_);
+    places.push_back(okPlace(okBox_));
+    return places;
+}
 
 Task<> OkDialog::Form_MouseDown(float x, float y) {
     if (hitTest(okBox_, x, y))

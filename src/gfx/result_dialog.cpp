@@ -50,19 +50,19 @@ void ResultDialog::Form_Load() {
 
 void ResultDialog::Form_Paint() {
     canvas().fill(canvas().bounds(), palette::blackBrush.colour);
-    drawShadowText(canvas(), statsBox_, 2, text_, text_format::centre);
+    drawShadowText(canvas(), textBox_, 2, text_, text_format::centre);
     drawOkButton(canvas(), okBox_);
 }
 
 void ResultDialog::layOut() {
     const std::int32_t u = layoutUnit_;
     const auto [width, height] = outerSize();
-    statsBox_ = {.left = u,
-                 .top = u,
-                 .width = width - 2 * u,
-                 .height = height - 4 * u,
-                 .textColour = palette::panelTextColour,
-                 .font = textFont};
+    textBox_ = {.left = u,
+                .top = u,
+                .width = width - 2 * u,
+                .height = height - 4 * u,
+                .textColour = palette::panelTextColour,
+                .font = textFont};
     okBox_ = layOutOkButton(roundHalfEven((width - okButtonSize.width) / 2.0), height - 2 * u);
 }
 

@@ -28,8 +28,6 @@ class ResultDialog final : public OkDialog {
 
     const GameState& game_;
     std::int16_t layoutUnit_;
-    ScreenButton statsBox_;
-    std::string text_;
 };
 
 }  // namespace quabble

@@ -9,6 +9,7 @@
 #include "base/task.hpp"
 #include "draw/canvas.hpp"
 #include "platform/input_event.hpp"
+#include "platform/place.hpp"
 
 namespace quabble {
 
@@ -21,6 +22,9 @@ class Control {
 
     bool visible = false;
     Rect area;
+
+    // What it is and does, in words.
+    virtual Place place() const = 0;
 
     virtual void paint(Canvas& canvas, bool hasFocus) const = 0;
     virtual Task<> mouseDown(Point at, bool extends) = 0;
@@ -38,6 +42,7 @@ class Control {
     virtual Task<> keyPress(std::int16_t key);
     virtual void textInput(std::string_view /*utf8*/) {}
     virtual void edit(EditCommand /*command*/, bool /*extends*/) {}
+    virtual std::optional<EditedText> editedText() const { return std::nullopt; }
 };
 
 // Paints the bright ring around the control that has the focus.
@@ -59,6 +64,7 @@ class Label final : public Control {
     Colour textColour;
     Colour background;
 
+    Place place() const override { return {area, Place::Role::Button, caption}; }
     void paint(Canvas& canvas, bool hasFocus) const override;
     Task<> mouseDown(Point, bool) override { return onClick_(); }
     bool isClickable() const override { return true; }
@@ -74,6 +80,9 @@ class PushButton final : public Control {
  public:
     explicit PushButton(ClickHandler onClick) : onClick_(std::move(onClick)) {}
 
+    std::string caption;  // Windows-1252
+
+    Place place() const override { return {area, Place::Role::Button, caption}; }
     void paint(Canvas& canvas, bool hasFocus) const override;
     Task<> mouseDown(Point at, bool extends) override;
     Task<> mouseUp(Point at) override;

@@ -80,6 +80,9 @@ class FrontEnd {
     // The whole of a file that comes with the program; empty when there is none or it cannot be read.
     virtual FileBytes programFile(std::string_view name) = 0;
 
+    // Something has happened that those who do not see it are to be told, after what they are being told.
+    virtual void say(std::string_view /*words*/) {}
+
     // Opens a web address, which has "://" in it, or a file that comes with the program, by its name, with
     // whatever the machine has for it. That it fails is not reported.
     virtual void openDocument(std::string_view /*document*/) {}

@@ -137,7 +137,7 @@ Task<> MessageLoop::deliver(InputEvent event) {
 
 // What the first press of a double click has brought onto the screen is not what the second one is meant for.
 bool MessageLoop::isMeant(const InputEvent& press, const Window& window) {
-    const std::pair screen(press.window, window.screen());
+    const std::pair screen(press.window, window.screenName());
     if (!press.continuesClick)
         clickedScreen_ = screen;
     return clickedScreen_ == screen;

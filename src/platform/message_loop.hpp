@@ -3,6 +3,7 @@
 #include <coroutine>
 #include <deque>
 #include <optional>
+#include <string>
 #include <utility>
 #include <vector>
 
@@ -122,7 +123,7 @@ class MessageLoop {
     std::vector<Timer*> timers_;
     std::vector<Window*> windows_;
     std::vector<Window*> modalWindows_;
-    std::pair<WindowId, int> clickedScreen_{};  // of the first press of a double click
+    std::pair<WindowId, std::string> clickedScreen_{};  // of the first press of a double click
     std::coroutine_handle<> program_;
     std::optional<TimePoint> programWaitsUntil_;
     std::uint32_t lastWindowId_ = 0;

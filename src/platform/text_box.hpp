@@ -17,7 +17,8 @@ class TextBox final : public Control {
     // The front end, which must outlive the box, has the clipboard.
     explicit TextBox(FrontEnd& frontEnd) : frontEnd_(frontEnd) {}
 
-    Font font;  // set before there is a text
+    Font font;         // set before there is a text
+    std::string name;  // what is to be typed, Windows-1252
 
     // The most characters that the box holds; what is typed or pasted beyond them is left out.
     static constexpr std::size_t maxLength = 32767;
@@ -29,6 +30,7 @@ class TextBox final : public Control {
     std::size_t caret() const { return caret_; }
     std::size_t anchor() const { return anchor_; }
 
+    Place place() const override { return {area, Place::Role::TextField, name}; }
     void paint(Canvas& canvas, bool hasFocus) const override;
     Task<> mouseDown(Point at, bool extends) override;
     void mouseDrag(Point at) override;
@@ -36,6 +38,7 @@ class TextBox final : public Control {
     bool takesText() const override { return true; }
     void textInput(std::string_view utf8) override;
     void edit(EditCommand command, bool extends) override;
+    std::optional<EditedText> editedText() const override { return EditedText{text_, caret_, anchor_}; }
 
  private:
     Rect inner() const { return area.shrunkBy(4); }

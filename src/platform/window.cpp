@@ -316,12 +316,21 @@ std::optional<Rect> Window::choosePlace(EditCommand command) {
     return next ? next : from;
 }
 
-std::vector<Rect> Window::placesInReach() const {
-    std::vector<Rect> reached = places();
-    std::erase_if(reached, [&](const Rect& place) { return controlAt(middleOf(place)) != nullptr; });
+std::vector<Place> Window::placesInSight() const {
+    std::vector<Place> seen = places();
+    std::erase_if(seen, [&](const Place& place) { return controlAt(middleOf(place.area)) != nullptr; });
     for (const Control* control : controls_) {
         if (control->visible)
-            reached.push_back(control->area);
+            seen.push_back(control->place());
+    }
+    return seen;
+}
+
+std::vector<Rect> Window::placesInReach() const {
+    std::vector<Rect> reached;
+    for (const Place& place : placesInSight()) {
+        if (place.isReached())
+            reached.push_back(place.area);
     }
     return reached;
 }
@@ -330,6 +339,18 @@ std::optional<Rect> Window::ringedPlace() const {
     if (!isRingShown_)
         return std::nullopt;
     return placeAt(placesInReach(), pointer());
+}
+
+Description Window::describe() const {
+    Description description{.name = screenName(), .places = placesInSight(), .current = {}, .edited = {}};
+    const std::optional<Rect> current = focus_ == nullptr ? ringedPlace() : std::optional(focus_->area);
+    const auto found = std::ranges::find_if(
+        description.places, [&](const Place& place) { return place.isReached() && place.area == current; });
+    if (found != description.places.end())
+        description.current = static_cast<std::size_t>(found - description.places.begin());
+    if (focus_ != nullptr)
+        description.edited = focus_->editedText();
+    return description;
 }
 
 void Window::hideRing() {

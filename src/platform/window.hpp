@@ -11,6 +11,7 @@
 #include "platform/control.hpp"
 #include "platform/input_event.hpp"
 #include "platform/message_loop.hpp"
+#include "platform/place.hpp"
 
 namespace quabble {
 
@@ -57,6 +58,9 @@ class Window {
     Point pointer() const;
     bool isRingShown() const { return isRingShown_; }
 
+    // What is to be seen of it, in words.
+    Description describe() const;
+
  protected:
     MessageLoop& loop() { return loop_; }
     void setCaption(std::string caption) { traits_.caption = std::move(caption); }  // UTF-8
@@ -70,12 +74,12 @@ class Window {
     // The control that the keyboard goes to; null for the window itself.
     void setFocus(Control* control);
 
-    // Which of its screens is shown, as a number, by a window that has several.
-    virtual int screen() const { return 0; }
+    // What is shown, by a window that has several screens; Windows-1252.
+    virtual std::string screenName() const { return traits_.caption; }
     // Whether the picture has something there that is to be clicked: the pointer is a hand above it.
     virtual bool isClickable(float /*x*/, float /*y*/) const { return false; }
-    // The areas of the picture that the arrow keys go to; a click in the middle of each must mean something.
-    virtual std::vector<Rect> places() const { return {}; }
+    // What its picture shows, controls left out.
+    virtual std::vector<Place> places() const { return {}; }
     virtual void Form_Load() {}
     // Paints all that is to be seen, as the window's state has it, on a canvas that is new: when it is shown,
     // and when its scale has changed.
@@ -106,6 +110,7 @@ class Window {
     bool isForPointer(EditCommand command) const;
     Task<> steerPointer(EditCommand command);
     std::optional<Rect> choosePlace(EditCommand command);
+    std::vector<Place> placesInSight() const;
     std::vector<Rect> placesInReach() const;
     std::optional<Rect> ringedPlace() const;
     void hideRing();

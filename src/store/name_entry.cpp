@@ -4,6 +4,8 @@
 
 #include "gfx/ok_button.hpp"
 #include "gfx/painters.hpp"
+#include "gfx/spoken_words.hpp"
+#include "gfx/string_table.hpp"
 
 namespace quabble {
 namespace {
@@ -11,8 +13,11 @@ namespace {
 constexpr std::size_t longestName = 19;
 constexpr Size dialogSize{360, 206};
 constexpr std::int32_t margin = 30;
+constexpr Rect congratulationArea{margin, 22, dialogSize.width - margin, 66};
+constexpr Rect promptArea{margin, 84, dialogSize.width - margin, 106};
 constexpr Font messageFont{Typeface::SansBold, 12};
 constexpr Font font{Typeface::Sans, 11};
+constexpr const char* prompt = "Enter Your Name";
 constexpr const char* congratulation = " Congratulations ! \r\n Your Score is among High scores ";
 
 }  // namespace
@@ -26,8 +31,10 @@ std::string acceptedName(const std::string& typed) {
 NameEntry::NameEntry(MessageLoop& loop, Window& owner)
     : Window(loop, &owner), txtName_(loop.frontEnd()), OKButton_([this] { return OKButton_Click(); }) {
     txtName_.font = font;
+    txtName_.name = prompt;
     txtName_.area = Rect::ofSize(margin, 108, dialogSize.width - 2 * margin, 28);
     txtName_.visible = true;
+    OKButton_.caption = loadString(string_ids::ok);
     OKButton_.visible = true;
     addControl(txtName_);
     addControl(OKButton_);
@@ -42,20 +49,23 @@ void NameEntry::Form_Load() {
     setFocus(&txtName_);
 }
 
+std::vector<Place> NameEntry::places() const {
+    return textPlaces(congratulationArea, congratulation);
+}
+
 void NameEntry::Form_Paint() {
-    const auto label = [](std::int32_t top, std::int32_t height, Colour colour, const Font& labelFont) {
-        return ScreenButton{.left = margin,
-                            .top = top,
-                            .width = dialogSize.width - 2 * margin,
-                            .height = height,
+    const auto label = [](const Rect& area, Colour colour, const Font& labelFont) {
+        return ScreenButton{.left = area.left,
+                            .top = area.top,
+                            .width = area.width(),
+                            .height = area.height(),
                             .textColour = colour,
                             .font = labelFont};
     };
     canvas().fill(canvas().bounds(), palette::backgroundColour);
-    drawShadowText(canvas(), label(22, 44, palette::valueColour, messageFont), 1, congratulation,
+    drawShadowText(canvas(), label(congratulationArea, palette::valueColour, messageFont), 1, congratulation,
                    text_format::centre);
-    drawShadowText(canvas(), label(84, 22, palette::highlightColour, font), 1, "Enter Your Name",
-                   defaultTextFormat);
+    drawShadowText(canvas(), label(promptArea, palette::highlightColour, font), 1, prompt, defaultTextFormat);
     drawOkButton(canvas(), okBox_);
 }
 

@@ -21,6 +21,7 @@ class NameEntry final : public Window {
 
  private:
     void Form_Load() override;
+    std::vector<Place> places() const override;
     void Form_Paint() override;
     void Form_Unload() override;
     Task<> Form_KeyPress(std::int16_t key) override;

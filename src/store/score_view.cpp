@@ -3,7 +3,9 @@
 #include <string>
 
 #include "base/round_half_even.hpp"
+#include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
+#include "gfx/spoken_words.hpp"
 #include "gfx/string_table.hpp"
 #include "store/version.hpp"
 
@@ -58,9 +60,16 @@ ScreenButton ScoreView::layOutButton(std::int32_t leftUnits) const {
             .font = font};
 }
 
+Rect ScoreView::rowArea(std::int32_t place) const {
+    return Rect::ofSize(unit_, unit_ * (place + 1), 9 * unit_, unit_);
+}
+
 void ScoreView::drawTitle() {
-    const auto title = static_cast<std::uint16_t>(string_ids::mainMenuBase + modeNum);
-    drawLabelledBox(canvas(), title_, BoxStyle::Plain, false, 2, loadString(title));
+    drawLabelledBox(canvas(), title_, BoxStyle::Plain, false, 2, title());
+}
+
+std::string_view ScoreView::title() const {
+    return loadString(static_cast<std::uint16_t>(string_ids::mainMenuBase + modeNum));
 }
 
 void ScoreView::drawRow(std::size_t place) {
@@ -79,10 +88,27 @@ void ScoreView::drawRow(std::size_t place) {
 }
 
 void ScoreView::drawButton(std::size_t i) {
-    const auto caption = static_cast<std::uint16_t>(string_ids::scoreViewBase + 1 + i);
     const bool highlighted = isHighlighted_[i];
     drawLabelledBox(canvas(), buttons_[i], highlighted ? BoxStyle::Framed : BoxStyle::Plain, highlighted,
-                    highlighted ? 6 : 4, loadString(caption));
+                    highlighted ? 6 : 4, captionOf(i));
+}
+
+std::string_view ScoreView::captionOf(std::size_t button) {
+    return loadString(static_cast<std::uint16_t>(string_ids::scoreViewBase + 1 + button));
+}
+
+std::vector<Place> ScoreView::places() const {
+    std::vector<Place> places{{title_.rect(), Place::Role::Text, std::string(title())}};
+    const HighScoreTable& table = highScores_.table(modeNum);
+    for (std::int32_t place = 0; place < highScorePlaces; ++place) {
+        const auto i = static_cast<std::size_t>(place);
+        places.push_back(
+            {rowArea(place), Place::Role::TableRow,
+             fillText(spoken::tableRow, {"|1", place + 1, "|2", table.names[i], "|3", table.scores[i]})});
+    }
+    for (std::size_t i = 0; i < buttons_.size(); ++i)
+        places.push_back({buttons_[i].rect(), Place::Role::Button, std::string(captionOf(i))});
+    return places;
 }
 
 Task<> ScoreView::Form_MouseMove(float x, float y) {

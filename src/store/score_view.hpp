@@ -23,7 +23,7 @@ class ScoreView final : public Window {
     bool isClickable(float x, float y) const override {
         return hitTest(buttons_[0], x, y) || hitTest(buttons_[1], x, y);
     }
-    std::vector<Rect> places() const override { return {buttons_[0].rect(), buttons_[1].rect()}; }
+    std::vector<Place> places() const override;
     Task<> Form_MouseDown(float x, float y) override;
     Task<> Form_MouseMove(float x, float y) override;
     Task<> Form_KeyPress(std::int16_t key) override;
@@ -32,9 +32,12 @@ class ScoreView final : public Window {
 
     void layOut();
     ScreenButton layOutButton(std::int32_t leftUnits) const;
+    std::string_view title() const;
+    Rect rowArea(std::int32_t place) const;
     void drawTitle();
     void drawRow(std::size_t place);
     void drawButton(std::size_t i);
+    static std::string_view captionOf(std::size_t button);
 
     HighScores& highScores_;
     std::int32_t unit_;

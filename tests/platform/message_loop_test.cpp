@@ -31,7 +31,7 @@ class Page final : public Window {
         ~Ending() { page.note("done"); }
     };
 
-    int screen() const override { return screen_; }
+    std::string screenName() const override { return screen_; }
     void Form_Load() override { setClientSize({10, 10}); }
     void Form_Unload() override { note("unload"); }
     Task<> Form_MouseDown(float, float) override {
@@ -49,7 +49,7 @@ class Page final : public Window {
                     co_await loop().showModal(*dialog_);
                     break;
                 case Step::ChangeScreen:
-                    ++screen_;
+                    screen_ = "another";
                     break;
                 case Step::Refresh:
                     refresh();
@@ -74,7 +74,7 @@ class Page final : public Window {
     std::string& log_;
     std::string name_;
     Window* dialog_;
-    int screen_ = 0;
+    std::string screen_ = "first";
 };
 
 class MessageLoopTest : public testing::Test {
