@@ -24,14 +24,26 @@ struct Running {
     PageBlob blob;
     BlobRegistryStore registry{blob};
     Program program;
+    std::uint64_t picturesTold = 0;
 
     Running(const Page& page, std::uint64_t seed) : frontEnd(page), program(frontEnd, registry, seed) {
         frontEnd.connect([this](const InputEvent& event) { program.post(event); });
+    }
+
+    // What has become of the pictures is told in words, too.
+    void tell() {
+        const Window* window = program.topmostWindow();
+        if (window == nullptr || picturesTold == program.picturesShown())
+            return;
+        picturesTold = program.picturesShown();
+        frontEnd.tell(window->id(), window->describe());
     }
 };
 
 std::unique_ptr<Running> running;
 std::string text;  // what the page hands over
+
+constexpr std::string_view keyThatAsks = "F2";  // how it stands
 
 WindowId idOf(std::uint32_t window) {
     return static_cast<WindowId>(window);
@@ -79,6 +91,9 @@ QUABBLE_EXPORT(moveMouse) void moveMouse(std::uint32_t window, std::int32_t x, s
 QUABBLE_EXPORT(releaseMouse) void releaseMouse(std::uint32_t window, std::int32_t x, std::int32_t y) {
     running->frontEnd.releaseMouse(idOf(window), {x, y});
 }
+QUABBLE_EXPORT(clickPlace) void clickPlace(std::uint32_t window, std::size_t place) {
+    running->frontEnd.clickPlace(idOf(window), place);
+}
 QUABBLE_EXPORT(pressCloseButton) void pressCloseButton(std::uint32_t window) {
     running->program.post({.window = idOf(window), .kind = EventKind::CloseButton});
 }
@@ -87,6 +102,10 @@ QUABBLE_EXPORT(pressCloseButton) void pressCloseButton(std::uint32_t window) {
 // the browser.
 QUABBLE_EXPORT(pressKey)
 bool pressKey(std::uint32_t window, bool shift, bool ctrl, bool alt, bool altGraph, bool isRepeated) {
+    if (text == keyThatAsks) {
+        running->frontEnd.sayTexts(idOf(window));
+        return true;
+    }
     auto event = translate({.key = text,
                             .shift = shift,
                             .ctrl = ctrl,
@@ -116,6 +135,7 @@ QUABBLE_EXPORT(pasteText) void pasteText(std::uint32_t window) {
 
 QUABBLE_EXPORT(wake) void wake() {
     running->program.wake();
+    running->tell();
 }
 // When to wake the program at the latest, by the page's clock in milliseconds; infinite when it waits for the
 // user.

@@ -30,6 +30,22 @@ QUABBLE_PAGE("setTextField")
 void setTextField(std::uint32_t window, std::int32_t left, std::int32_t top, std::int32_t width,
                   std::int32_t height);
 
+// What is read beside a window's picture; places are counted from 0, sizes in percent of the client area.
+QUABBLE_PAGE("nameScreen") void nameScreen(std::uint32_t window, const char* name, std::size_t nameSize);
+QUABBLE_PAGE("clearPlaces") void clearPlaces(std::uint32_t window);
+// A place for the first time since they were cleared, or its new words. The role is one of Place::Role.
+QUABBLE_PAGE("setPlace")
+void setPlace(std::uint32_t window, std::size_t place, std::uint32_t role, double left, double top,
+              double width, double height, const char* words, std::size_t wordsSize);
+// The place that the keyboard is at; -1 for none.
+QUABBLE_PAGE("setCurrentPlace") void setCurrentPlace(std::uint32_t window, std::int32_t place);
+// What the text field is for, and what the program has in it; caret and anchor in characters.
+QUABBLE_PAGE("setFieldText")
+void setFieldText(std::uint32_t window, const char* label, std::size_t labelSize, const char* text,
+                  std::size_t textSize, std::size_t caret, std::size_t anchor);
+// Says it, after what is being said.
+QUABBLE_PAGE("say") void say(const char* words, std::size_t wordsSize);
+
 QUABBLE_PAGE("openDocument") void openDocument(const char* document, std::size_t size);
 
 // Each text or file is first asked for its size, which is 0 when there is none, and then taken at once.

@@ -63,6 +63,7 @@ void WebFrontEnd::showPixels(WindowId window, const Surface& picture) {
 
 void WebFrontEnd::closeWindow(WindowId window) {
     windows_.erase(window);
+    voice_.close(window);
     page::closeWindow(number(window));
 }
 
@@ -187,6 +188,25 @@ std::string WebFrontEnd::clipboardText() {
 
 void WebFrontEnd::setClipboardText(const std::string& text) {
     page::setClipboard(text.data(), text.size());
+}
+
+// --- For those who do not see the pictures ---
+
+void WebFrontEnd::tell(WindowId window, const Description& description) {
+    const auto found = windows_.find(window);
+    if (found == windows_.end())
+        return;
+    const NativeWindow& traits = found->second.traits;
+    voice_.tell(window, traits.owner != WindowId::none, traits.clientSize, description);
+}
+
+void WebFrontEnd::clickPlace(WindowId window, std::size_t place) {
+    const Point at = voice_.middleOf(window, place);
+    InputEvent event{.window = window, .x = static_cast<float>(at.x), .y = static_cast<float>(at.y)};
+    for (const EventKind kind : {EventKind::MouseMove, EventKind::MouseDown, EventKind::MouseUp}) {
+        event.kind = kind;
+        post_(event);
+    }
 }
 
 // --- Files ---

@@ -7,6 +7,7 @@
 #include <string_view>
 
 #include "hosts/web/page_layout.hpp"
+#include "hosts/web/voice.hpp"
 #include "platform/front_end.hpp"
 #include "platform/input_event.hpp"
 
@@ -36,6 +37,15 @@ class WebFrontEnd final : public FrontEnd {
     void releaseMouse(WindowId window, Point at);
     bool editsText(WindowId window) const;
 
+    // --- For those who do not see the pictures ---
+
+    // What the window that takes input looks like now.
+    void tell(WindowId window, const Description& description);
+    // Somebody has chosen one of the places that the page was told of.
+    void clickPlace(WindowId window, std::size_t place);
+    // Somebody asks how it stands.
+    void sayTexts(WindowId window) const { voice_.sayTexts(window); }
+
     // --- FrontEnd ---
 
     TimePoint now() override;
@@ -46,6 +56,7 @@ class WebFrontEnd final : public FrontEnd {
     void setPointer(WindowId window, PointerShape shape) override;
     void setTextInput(WindowId window, std::optional<Rect> area) override;
     FileBytes programFile(std::string_view name) override;
+    void say(std::string_view words) override { voice_.say(words); }
     void openDocument(std::string_view document) override;
     std::string clipboardText() override;
     void setClipboardText(const std::string& text) override;
@@ -74,6 +85,7 @@ class WebFrontEnd final : public FrontEnd {
     bool isHidden_ = false;
     std::map<WindowId, Shown> windows_;
     Press lastPress_;
+    Voice voice_;
 };
 
 }  // namespace quabble

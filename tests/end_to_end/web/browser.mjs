@@ -14,6 +14,8 @@ const pictures = join(build, 'program_files', 'bin');
 const require = createRequire(join(build, 'src/hosts/web/tools/'));
 const puppeteer = require('puppeteer-core');
 export const {PNG} = require('pngjs');
+/** The script of a program that looks for faults of accessibility. */
+export const axe = readFileSync(require.resolve('axe-core/axe.min.js'), 'utf8');
 
 export const isFirefox = browserName === 'firefox';
 /** A window of this size in the page shows the program at scale 1. */

@@ -93,8 +93,8 @@ export default {
 
   'Tab goes through the page and does not pause': async (browser) => {
     const visit = await Visit.open(browser, site.address);
-    const focus = () => visit.see(() => document.activeElement?.className || document.activeElement?.tagName);
-    expect((await focus()) === 'CANVAS', 'The game does not have the keyboard when the page opens.');
+    const focus = () => visit.see(() => document.activeElement?.className || document.activeElement?.role);
+    expect((await focus()) === 'application', 'The game does not have the keyboard when the page opens.');
     await visit.choose(menu.timed);
     const board = await visit.untilBoard(false);
     await visit.tab.keyboard.down('Shift');
@@ -102,7 +102,7 @@ export default {
     await visit.tab.keyboard.up('Shift');
     expect((await focus()) === 'close', 'Tab does not lead to the close button.');
     await visit.tab.keyboard.press('Tab');
-    expect((await focus()) === 'CANVAS', 'Tab does not lead back to the game.');
+    expect((await focus()) === 'application', 'Tab does not lead back to the game.');
     expect((await visit.board(false)) === board, 'Tab has paused the game.');
     await visit.close();
   },

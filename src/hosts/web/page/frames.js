@@ -1,9 +1,12 @@
 // The program's windows: frames on the desk, each with a canvas. Sizes and places are in device pixels.
 
+import {Spoken} from './spoken.js';
+import {TextField} from './text_field.js';
+
 /**
  * @typedef {import('./program.js').Program} Program
  * @typedef {{frame: HTMLElement, bar: HTMLElement | null, canvas: HTMLCanvasElement, paint: CanvasRenderingContext2D,
- *   field: HTMLInputElement | null, owner: number, caption: string, client: number[]}} Shown
+ *   spoken: Spoken, field: TextField | null, owner: number, caption: string, client: number[]}} Shown
  */
 
 export class Frames {
@@ -57,11 +60,12 @@ export class Frames {
       frame.ariaModal = 'true';
     }
     const canvas = document.createElement('canvas');
-    canvas.tabIndex = 0;
+    canvas.ariaHidden = 'true';
+    const spoken = new Spoken(window, owner !== 0, (place) => this.#program.call('clickPlace', window, place));
     const paint = /** @type {CanvasRenderingContext2D} */ (canvas.getContext('2d', {alpha: false}));
     const bar = isBorderless ? null : this.#makeBar(window, owner, caption);
-    frame.append(...(bar === null ? [canvas] : [bar, canvas]));
-    this.#windows.set(window, {frame, bar, canvas, paint, field: null, owner, caption, client: []});
+    frame.append(...(bar === null ? [] : [bar]), canvas, spoken.element);
+    this.#windows.set(window, {frame, bar, canvas, paint, spoken, field: null, owner, caption, client: []});
     this.#listen(window, frame, canvas);
     this.#desk.append(frame);
     this.#letOneTakeInput();
@@ -114,6 +118,7 @@ export class Frames {
     shown.client = places.slice(4);
     lay(shown.frame, places);
     lay(shown.canvas, shown.client);
+    lay(shown.spoken.element, shown.client);
     if (shown.bar !== null) shown.bar.style.height = css(shown.client[1]);
     this.#sharpen(shown);
   }
@@ -145,7 +150,7 @@ export class Frames {
     if (!frame.classList.contains('seen')) {
       frame.classList.add('seen');
       document.getElementById('splash')?.remove();
-      (shown.field ?? canvas).focus();
+      focus(shown);
     }
   }
 
@@ -157,7 +162,7 @@ export class Frames {
     shown.frame.remove();
     this.#letOneTakeInput();
     const owner = this.#windows.get(shown.owner);
-    (owner?.field ?? owner?.canvas)?.focus();
+    if (owner !== undefined) focus(owner);
     return shown.owner !== 0;
   }
 
@@ -172,7 +177,7 @@ export class Frames {
     button.addEventListener('click', () => {
       button.remove();
       shown.frame.hidden = false;
-      shown.canvas.focus();
+      focus(shown);
       this.#program.call('setMinimised', window, false);
     });
     this.#desk.append(button);
@@ -222,7 +227,8 @@ export class Frames {
     });
     canvas.addEventListener('mousedown', (event) => {
       event.preventDefault(); // the keyboard stays where it is, or goes to the text field
-      (this.#windows.get(window)?.field ?? canvas).focus();
+      const shown = this.#windows.get(window);
+      if (shown !== undefined) focus(shown);
     });
     canvas.addEventListener('contextmenu', (event) => event.preventDefault());
     frame.addEventListener('keydown', (event) => this.#pressKey(window, event));
@@ -250,69 +256,36 @@ export class Frames {
     const shown = this.#windows.get(window);
     if (shown === undefined) return;
     if (width === 0) {
-      if (shown.field === document.activeElement) shown.canvas.focus();
-      shown.field?.remove();
+      const hadFocus = shown.field?.element === document.activeElement;
+      shown.field?.element.remove();
       shown.field = null;
+      if (hadFocus) focus(shown);
       return;
     }
     if (shown.field === null) {
-      shown.field = this.#makeField(window);
-      shown.frame.append(shown.field);
-      if (shown.frame.classList.contains('seen')) shown.field.focus();
+      shown.field = new TextField(window, this.#program);
+      shown.frame.append(shown.field.element);
+      if (shown.frame.classList.contains('seen')) focus(shown);
     }
-    lay(shown.field, [shown.client[0] + left, shown.client[1] + top, width, height]);
+    lay(shown.field.element, [shown.client[0] + left, shown.client[1] + top, width, height]);
+  }
+
+  // --- What is read ---
+
+  /** @param {number} window */
+  spoken(window) {
+    return this.#windows.get(window)?.spoken;
   }
 
   /** @param {number} window */
-  #makeField(window) {
-    const field = document.createElement('input');
-    Object.assign(field, {type: 'text', autocomplete: 'off', spellcheck: false, enterKeyHint: 'done'});
-    field.setAttribute('autocorrect', 'off');
-    field.ariaLabel = 'Enter Your Name';
-    // Something to delete, without which keyboards on a screen report no deletion.
-    const empty = () => {
-      field.value = ' ';
-      field.setSelectionRange(1, 1);
-    };
-    empty();
-    let half = ''; // of a character that Firefox reports in two halves
-    /** @param {string | null} text */
-    const type = (text) => {
-      const whole = half + (text ?? '');
-      half = /^[\uD800-\uDBFF]$/.test(whole) ? whole : '';
-      if (whole !== half) this.#program.callWithText(whole, 'typeText', window);
-    };
-    field.addEventListener('beforeinput', (event) => {
-      if (event.isComposing || event.inputType === 'insertCompositionText') return;
-      event.preventDefault();
-      if (event.inputType === 'deleteContentBackward')
-        this.#program.callWithText('Backspace', 'pressKey', window, false, false, false, false, false);
-      else if (event.inputType !== 'insertLineBreak') type(event.data);
-    });
-    field.addEventListener('compositionstart', () => {
-      field.value = '';
-      field.classList.add('composing');
-    });
-    field.addEventListener('compositionend', (event) => {
-      field.classList.remove('composing');
-      empty();
-      type(event.data);
-    });
-    field.addEventListener('paste', (event) => {
-      event.preventDefault();
-      this.#program.clipboard = event.clipboardData?.getData('text/plain') ?? '';
-      this.#program.call('pasteText', window);
-    });
-    for (const act of /** @type {const} */ (['copy', 'cut'])) {
-      field.addEventListener(act, (event) => {
-        event.preventDefault();
-        this.#program.clipboard = '';
-        this.#program.call(`${act}Text`, window);
-        if (this.#program.clipboard !== '') event.clipboardData?.setData('text/plain', this.#program.clipboard);
-      });
-    }
-    return field;
+  field(window) {
+    return this.#windows.get(window)?.field;
   }
+}
+
+/** The keyboard goes to what takes it in a window. @param {Shown} shown */
+function focus({field, spoken}) {
+  (field?.element ?? spoken.keyboard).focus();
 }
 
 /** @param {number} devicePixels */

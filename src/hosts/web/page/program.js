@@ -1,5 +1,7 @@
 // The program: calls into it, what it asks of the page, and the one alarm that wakes it.
 
+import {say} from './spoken.js';
+
 /**
  * @typedef {import('./frames.js').Frames} Frames
  * @typedef {import('./keeping.js').Keeping} Keeping
@@ -139,6 +141,14 @@ export class Program {
       minimiseWindow: (window) => frames.minimise(window),
       setPointer: (window, isHand) => frames.setPointer(window, isHand !== 0),
       setTextField: (window, ...place) => frames.setTextField(window, place),
+      nameScreen: (window, name, size) => frames.spoken(window)?.nameScreen(this.#textAt(name, size)),
+      clearPlaces: (window) => frames.spoken(window)?.clear(),
+      setPlace: (window, place, role, left, top, width, height, words, size) =>
+        frames.spoken(window)?.set(place, role, [left, top, width, height], this.#textAt(words, size)),
+      setCurrentPlace: (window, place) => frames.spoken(window)?.setCurrent(place),
+      setFieldText: (window, label, labelSize, text, size, caret, anchor) =>
+        frames.field(window)?.set(this.#textAt(label, labelSize), this.#textAt(text, size), caret, anchor),
+      say: (words, size) => say(this.#textAt(words, size)),
       openDocument: (document, size) => this.page.open(this.#textAt(document, size)),
       fileSize: (file, size) => this.#ask(this.files.get(this.#textAt(file, size))),
       clipboardSize: () => this.#ask(new TextEncoder().encode(this.clipboard)),
