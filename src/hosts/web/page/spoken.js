@@ -29,7 +29,7 @@ export class Spoken {
     this.element.className = 'spoken';
     this.keyboard.role = 'application';
     this.keyboard.tabIndex = 0;
-    this.keyboard.ariaLabel = 'Game';
+    this.keyboard.ariaLabel = 'Quabble';
     this.keyboard.setAttribute('aria-description', keysHint);
     this.element.append(this.keyboard);
     this.element.addEventListener('click', (event) => {
