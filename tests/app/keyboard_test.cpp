@@ -56,61 +56,7 @@ struct KeyboardMachine : Machine {
         walkTo(x, y);
         user.edit(EditCommand::Click);
     }
-    void chooseFromMenu(int button) { clickBy(337, 52 * button + 18); }
-
-    // Takes the largest cluster, and the waiting row when there is none. False when the game has ended.
-    bool makeMove() {
-        const bool isTraining = game.gameMode == GameMode::Training;
-        const auto [place, size] = choose(model::read(lettersOf(game.grid)));
-        const Rect square = cell(place.first, place.second);
-        if (size >= (isTraining ? 2 : 3))
-            clickBy(square.left + 14, square.top + 14);
-        else
-            clickBy(400, 518);
-        user.wait(600ms);
-        return game.isGameActive();
-    }
-    std::string caption() { return user.top().traits.caption; }
 };
-
-TEST(Keyboard, PlaysAWholeGameOfEachModeFromTheMenuToTheTable) {
-    for (int mode = 1; mode <= 3; ++mode) {
-        SCOPED_TRACE(mode);
-        KeyboardMachine machine{MemoryBlob()};
-        machine.chooseFromMenu(mode);
-        for (int moves = 0; machine.makeMove() && (mode == 1 || moves < 40);) {
-            if (machine.hasDialog())
-                machine.clickBy(230, 215);  // a level is complete
-            ASSERT_LT(++moves, 150);
-        }
-        if (machine.game.isGameActive())
-            machine.clickBy(95, 465);  // End game
-        EXPECT_GT(machine.game.stats.score, 100);
-        ASSERT_EQ(machine.caption(), "Game Statistics");
-        machine.clickBy(230, 215);
-        ASSERT_EQ(machine.caption(), "Best Score");
-        machine.user.type("Joan");
-        machine.user.edit(EditCommand::Left);
-        machine.user.type("h");
-        machine.user.edit(EditCommand::Down);
-        machine.user.type("!");
-        EXPECT_TRUE(machine.ring().contains(180, 170)) << "the OK button";
-        machine.user.edit(EditCommand::Up);
-        machine.user.edit(EditCommand::End);
-        machine.user.type("a");
-        machine.clickBy(180, 170);
-        ASSERT_EQ(machine.caption(), "Best Scores - Quabble");
-        EXPECT_EQ(machine.app.highScores.table(static_cast<std::int16_t>(mode)).names[0], "Joahna");
-        machine.clickBy(150, 420);
-        EXPECT_TRUE(machine.game.mainMenuActive);
-        machine.chooseFromMenu(mode + 3);
-        machine.clickBy(300, 420);  // Clear Scores
-        EXPECT_EQ(machine.app.highScores.table(static_cast<std::int16_t>(mode)).scores[0], 0);
-        machine.clickBy(150, 420);
-        machine.chooseFromMenu(8);
-        EXPECT_TRUE(machine.program.ended());
-    }
-}
 
 // The mouse then comes to where the keys have brought the pointer, and the ring goes: the very picture stays.
 TEST(Keyboard, ShowsWhatTheMouseShowsAndARing) {

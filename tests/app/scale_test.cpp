@@ -81,56 +81,5 @@ TEST(Scales, ShowEveryScreenAsItIsAtScaleOne) {
     }
 }
 
-// The first machine has its scale from the beginning, the other one gets it on the way: then they look alike.
-TEST(Scales, MayChangeAtAnyMoment) {
-    const std::pair<const char*, std::function<void(Machine&, const std::function<void()>&)>> stories[] = {
-        {"in a move",
-         [](Machine& machine, const auto& change) {
-             machine.start(1, ".....2.4/.....1.4/...31134");
-             machine.clickCell(5, 16);
-             machine.user.wait(100ms);
-             change();
-             machine.user.wait(100ms);
-             machine.clickPanel(6);
-             machine.user.wait(1s);
-         }},
-        {"in a dialog",
-         [](Machine& machine, const auto& change) {
-             machine.clickMenu(2);
-             machine.user.wait(3500ms);
-             machine.clickPanel(10);
-             change();
-             machine.user.wait(1s);
-         }},
-        {"behind the pause notice",
-         [](Machine& machine, const auto& change) {
-             machine.clickMenu(2);
-             machine.user.wait(1s);
-             machine.clickPanel(8);
-             change();
-             machine.user.wait(1s);
-             machine.user.click(10, 10);
-             machine.user.wait(1s);
-         }},
-        {"while minimised", [](Machine& machine, const auto& change) {
-             machine.clickMenu(3);
-             machine.user.press('q');
-             change();
-             machine.user.restore();
-             machine.user.click(10, 10);
-             machine.clickStrip();
-         }}};
-    for (const auto& [name, play] : stories) {
-        Machine there(1, Scale::ofQuarters(6));
-        play(there, [] {});
-        Machine changed;
-        play(changed, [&] { changed.frontEnd.rescale(Scale::ofQuarters(6)), changed.program.wake(); });
-        EXPECT_EQ(changed.game.stats.score, there.game.stats.score) << name;
-        ASSERT_EQ(changed.frontEnd.windows().size(), there.frontEnd.windows().size()) << name;
-        for (const auto& [window, shown] : there.frontEnd.windows())
-            EXPECT_TRUE(changed.frontEnd.windows().at(window).picture == shown.picture) << name;
-    }
-}
-
 }  // namespace
 }  // namespace quabble
