@@ -129,9 +129,6 @@ QUABBLE_EXPORT(copyText) void copyText(std::uint32_t window) {
 QUABBLE_EXPORT(cutText) void cutText(std::uint32_t window) {
     running->program.post({.window = idOf(window), .kind = EventKind::Edit, .command = EditCommand::Cut});
 }
-QUABBLE_EXPORT(pasteText) void pasteText(std::uint32_t window) {
-    running->program.post({.window = idOf(window), .kind = EventKind::Edit, .command = EditCommand::Paste});
-}
 
 QUABBLE_EXPORT(wake) void wake() {
     running->program.wake();

@@ -50,7 +50,6 @@ QUABBLE_PAGE("openDocument") void openDocument(const char* document, std::size_t
 
 // Each text or file is first asked for its size, which is 0 when there is none, and then taken at once.
 QUABBLE_PAGE("fileSize") std::size_t fileSize(const char* name, std::size_t nameSize);
-QUABBLE_PAGE("clipboardSize") std::size_t clipboardSize();
 // -1 when what is kept cannot be read.
 QUABBLE_PAGE("storageSize") std::int32_t storageSize();
 QUABBLE_PAGE("take") void take(void* to);

@@ -180,12 +180,6 @@ bool WebFrontEnd::editsText(WindowId window) const {
     return found != windows_.end() && found->second.textArea.has_value();
 }
 
-std::string WebFrontEnd::clipboardText() {
-    std::string text(page::clipboardSize(), '\0');
-    page::take(text.data());
-    return text;
-}
-
 void WebFrontEnd::setClipboardText(const std::string& text) {
     page::setClipboard(text.data(), text.size());
 }

@@ -58,7 +58,7 @@ class WebFrontEnd final : public FrontEnd {
     FileBytes programFile(std::string_view name) override;
     void say(std::string_view words) override { voice_.say(words); }
     void openDocument(std::string_view document) override;
-    std::string clipboardText() override;
+    // What is pasted comes as typed text.
     void setClipboardText(const std::string& text) override;
 
  private:

@@ -16,7 +16,7 @@ export class Program {
   #hasClosedDialog = false;
   #failure = /** @type {unknown} */ (null); // of something that the program asked for
   #asked = /** @type {Uint8Array} */ (new Uint8Array());
-  /** What was cut or copied last, and what is to be pasted. */
+  /** What was cut or copied last. */
   clipboard = '';
 
   /**
@@ -151,7 +151,6 @@ export class Program {
       say: (words, size) => say(this.#textAt(words, size)),
       openDocument: (document, size) => this.page.open(this.#textAt(document, size)),
       fileSize: (file, size) => this.#ask(this.files.get(this.#textAt(file, size))),
-      clipboardSize: () => this.#ask(new TextEncoder().encode(this.clipboard)),
       storageSize: () => {
         const kept = this.keeping.read();
         return kept === null ? -1 : this.#ask(kept);

@@ -31,11 +31,6 @@ export class TextField {
       this.#show();
       this.#type(event.data);
     });
-    field.addEventListener('paste', (event) => {
-      event.preventDefault();
-      program.clipboard = event.clipboardData?.getData('text/plain') ?? '';
-      program.call('pasteText', window);
-    });
     for (const act of /** @type {const} */ (['copy', 'cut'])) {
       field.addEventListener(act, (event) => {
         event.preventDefault();
