@@ -8,30 +8,15 @@
 #include <memory>
 #include <string>
 
-#include "app/program.hpp"
-#include "hosts/web/page_blob.hpp"
 #include "hosts/web/page_keys.hpp"
-#include "hosts/web/web_front_end.hpp"
-
-#define QUABBLE_EXPORT(name) extern "C" __attribute__((export_name(#name)))
+#include "hosts/web/running.hpp"
 
 namespace quabble {
-namespace {
-
-// All that lives as long as the page.
-struct Running {
-    WebFrontEnd frontEnd;
-    PageBlob blob;
-    BlobRegistryStore registry{blob};
-    Program program;
-
-    Running(const Page& page, std::uint64_t seed) : frontEnd(page), program(frontEnd, registry, seed) {
-        frontEnd.connect([this](const InputEvent& event) { program.post(event); });
-    }
-};
 
 std::unique_ptr<Running> running;
-std::string text;  // what the page hands over
+std::string text;
+
+namespace {
 
 WindowId idOf(std::uint32_t window) {
     return static_cast<WindowId>(window);

@@ -15,6 +15,13 @@ namespace quabble {
 // A page in a browser. Windows are frames within it, and a page that is hidden counts as minimised.
 class WebFrontEnd final : public FrontEnd {
  public:
+    struct Shown {
+        NativeWindow traits;
+        WindowPlace place;
+        bool isMinimised = false;
+        std::optional<Rect> textArea;
+    };
+
     explicit WebFrontEnd(const Page& page) : page_(page) {}
 
     // Where the program is posted what happens; to be set before the program starts.
@@ -36,6 +43,9 @@ class WebFrontEnd final : public FrontEnd {
     void releaseMouse(WindowId window, Point at);
     bool editsText(WindowId window) const;
 
+    // The frames in the page, the topmost last.
+    const std::map<WindowId, Shown>& windows() const { return windows_; }
+
     // --- FrontEnd ---
 
     TimePoint now() override;
@@ -51,12 +61,6 @@ class WebFrontEnd final : public FrontEnd {
     void setClipboardText(const std::string& text) override;
 
  private:
-    struct Shown {
-        NativeWindow traits;
-        WindowPlace place;
-        bool isMinimised = false;
-        std::optional<Rect> textArea;
-    };
     struct Press {
         WindowId window = WindowId::none;
         Point at;

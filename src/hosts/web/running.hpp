@@ -1,0 +1,30 @@
+#pragma once
+
+#include <cstdint>
+#include <memory>
+#include <string>
+
+#include "app/program.hpp"
+#include "hosts/web/page_blob.hpp"
+#include "hosts/web/web_front_end.hpp"
+
+#define QUABBLE_EXPORT(name) extern "C" __attribute__((export_name(#name)))
+
+namespace quabble {
+
+// All that lives as long as the page.
+struct Running {
+    WebFrontEnd frontEnd;
+    PageBlob blob;
+    BlobRegistryStore registry{blob};
+    Program program;
+
+    Running(const Page& page, std::uint64_t seed) : frontEnd(page), program(frontEnd, registry, seed) {
+        frontEnd.connect([this](const InputEvent& event) { program.post(event); });
+    }
+};
+
+extern std::unique_ptr<Running> running;
+extern std::string text;  // what the page hands over
+
+}  // namespace quabble

@@ -1,0 +1,68 @@
+// The visits that all machines play, in the page: a clock that is moved by hand, and what the canvas shows.
+import {readFileSync, readdirSync} from 'node:fs';
+import {join} from 'node:path';
+import {expect, serveSite, until, Visit} from './browser.mjs';
+
+const site = await serveSite();
+export const leave = () => site.close();
+const folder = join(import.meta.dirname, '../../visits');
+
+/** Runs in the page before its own script. */
+function stopClock() {
+  window.clock = 0;
+  const half = 0.5e-6; // of a nanosecond, the least that the program knows
+  performance.now = () => window.clock + half;
+}
+
+/** Plays a visit in the page; returns what is other than expected. */
+function play(visit) {
+  const program = window.seen.exports;
+  const handOver = (bytes, place) => new Uint8Array(program.memory.buffer, place, bytes.length).set(bytes);
+  const handOverText = (text) => {
+    const bytes = new TextEncoder().encode(text);
+    handOver(bytes, program.textBuffer(bytes.length));
+  };
+  const pass = (end) => {
+    for (let due; !program.areWakesWritten() && (due = program.nextDeadline()) <= end; program.wake()) window.clock = due;
+    window.clock = end;
+  };
+  const top = () => [...document.querySelectorAll('.frame canvas')].at(-1);
+  const show = [
+    () => {},
+    () => handOverText(top()?.parentElement.ariaLabel ?? ''),
+    () => {
+      const {width, height} = top();
+      handOver(top().getContext('2d').getImageData(0, 0, width, height).data, program.pictureBuffer(width, height));
+    },
+    () => document.querySelector('.minimised').click(),
+  ];
+  handOverText(visit);
+  program.beginVisit();
+  for (let time; (time = program.timeOfStep()) >= 0;) {
+    const need = program.needOfStep();
+    pass(time);
+    show[need]();
+    const difference = program.takeStep();
+    if (difference !== 0) {
+      const bytes = new Uint8Array(program.memory.buffer, difference);
+      return new TextDecoder().decode(bytes.slice(0, bytes.indexOf(0)));
+    }
+  }
+  return null;
+}
+
+const stories = {};
+for (const name of readdirSync(folder).filter((name) => name.endsWith('.visit'))) {
+  const text = readFileSync(join(folder, name), 'utf8');
+  for (const scale of [1, 2]) {
+    stories[`${name} at scale ${scale}`] = async (browser) => {
+      const [, seed] = /^seed (\d+)$/m.exec(text) ?? [null, 1];
+      const visit = await Visit.open(browser, site.address, {ratio: scale, seed, before: stopClock, until: 'splash'});
+      await until('the last pictures', () => visit.see(() => window.seen.exports?.canVisit()));
+      const difference = await visit.see(play, text);
+      expect(difference === null, `${name}, ${difference}`);
+      await visit.close();
+    };
+  }
+}
+export default stories;
