@@ -19,6 +19,7 @@ const Surface& VisitPlayer::ScreenlessMachine::picture() const {
 VisitPlayer::VisitPlayer(const Visit& visit, HeadlessFrontEnd::Files files, std::optional<Scale> scale)
     : areWakesWritten_(visit.areWakesWritten),
       machine_(std::move(files)),
+      kept_(std::vector<std::byte>(visit.isStoreDamaged ? 1 : 0)),
       program_(machine_.frontEnd, registry_, visit.seed),
       start_(machine_.frontEnd.now()) {
     machine_.frontEnd.scale = scale.value_or(visit.scale);

@@ -118,9 +118,8 @@ std::string VisitSteps::seen(const VisitStep& expectation) const {
         return {};
     if (expectation.what == window)
         return windows.back().caption;
-    const Surface& picture = machine_.picture();
-    return std::string(wordOf(scaleOf(picture, windows.back().clientSize))) + " " +
-           hexOf(fingerprintOf(picture));
+    const Surface& shown = machine_.picture();
+    return std::string(wordOf(scaleOf(shown, windows.back().clientSize))) + " " + hexOf(fingerprintOf(shown));
 }
 
 bool VisitSteps::isAsExpected(const VisitStep& expectation) const {

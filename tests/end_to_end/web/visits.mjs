@@ -10,6 +10,7 @@ const folder = join(import.meta.dirname, '../../visits');
 /** Runs in the page before its own script. */
 function beginAnew() {
   localStorage.clear();
+  if (location.hash.endsWith('damaged')) localStorage.setItem('quabble', 'x');
   window.open = () => null; // the help's tab would hide the page
   window.clock = 0;
   const half = 0.5e-6; // of a nanosecond, the least that the program knows
@@ -60,7 +61,8 @@ async function playAll(browser, scale) {
   for (const name of readdirSync(folder).filter((name) => name.endsWith('.visit'))) {
     const text = readFileSync(join(folder, name), 'utf8');
     const [, seed] = /^seed (\d+)$/m.exec(text) ?? [null, 1];
-    await visit.see((seed) => void (location.hash = `seed=${seed}`), seed);
+    const store = /^store damaged$/m.test(text) ? 'damaged' : 'new';
+    await visit.see((start) => void (location.hash = start), `seed=${seed}&store=${store}`);
     await visit.tab.reload();
     await until('last pictures', () => visit.see(() => window.seen.exports?.canVisit()));
     const difference = await visit.see(play, text);
