@@ -19,8 +19,7 @@ function beginAnew() {
 
 /** Plays a visit in the page; returns what is other than expected. */
 function play(visit) {
-  const program = window.seen.exports;
-  const handOver = (bytes, place) => new Uint8Array(program.memory.buffer, place, bytes.length).set(bytes);
+  const {exports: program, handOver, handOverPicture, textAt} = window.seen;
   const handOverText = (text) => {
     const bytes = new TextEncoder().encode(text);
     handOver(bytes, program.textBuffer(bytes.length));
@@ -33,10 +32,7 @@ function play(visit) {
   const show = [
     () => {},
     () => handOverText(top()?.parentElement.ariaLabel ?? ''),
-    () => {
-      const {width, height} = top();
-      handOver(top().getContext('2d').getImageData(0, 0, width, height).data, program.pictureBuffer(width, height));
-    },
+    () => handOverPicture(top()),
     () => document.querySelector('.minimised').click(),
   ];
   handOverText(visit);
@@ -46,10 +42,7 @@ function play(visit) {
     pass(time);
     show[need]();
     const difference = program.takeStep();
-    if (difference !== 0) {
-      const bytes = new Uint8Array(program.memory.buffer, difference);
-      return new TextDecoder().decode(bytes.slice(0, bytes.indexOf(0)));
-    }
+    if (difference !== 0) return textAt(difference);
   }
   return null;
 }

@@ -1,5 +1,5 @@
-// What the page's program has only for its tests: it plays a visit in the page. visits.mjs makes time pass,
-// and hands over what the page shows.
+// What the page's program has only for its tests: it reads the page's pictures, and plays visits in the page.
+// Their scripts make time pass and hand over what the canvas shows.
 
 #include "hosts/headless/visit_steps.hpp"
 #include "hosts/web/running.hpp"
@@ -30,19 +30,31 @@ class PageMachine final : public VisitMachine {
     Surface shown;
 };
 
+PageMachine machine;
+std::string told;
+
 // A visit that is being played.
 struct Playing {
     Visit visit;
     std::size_t next = 0;  // step
-    PageMachine machine;
     VisitSteps steps{running->program, machine};
-    std::string difference;
 
     const VisitStep& step() const { return visit.steps[next]; }
 };
 std::unique_ptr<Playing> playing;
 
 }  // namespace
+
+// Room for the picture that is shown, to be handed over as red, green, blue and 255 for each pixel.
+QUABBLE_EXPORT(pictureBuffer) void* pictureBuffer(std::int32_t width, std::int32_t height) {
+    machine.shown = Surface(width, height);
+    return machine.shown.row(0).data();
+}
+// That picture in the words of a visit, as a text that a zero ends.
+QUABBLE_EXPORT(seenPicture) const char* seenPicture() {
+    told = VisitSteps(running->program, machine).seen({.what = std::string(expectations::picture)});
+    return told.c_str();
+}
 
 // False while the page does not have all pictures.
 QUABBLE_EXPORT(canVisit) bool canVisit() {
@@ -74,12 +86,7 @@ QUABBLE_EXPORT(needOfStep) Need needOfStep() {
     const bool restores = step.kind == VisitStep::Kind::Event && step.event.kind == EventKind::Restored;
     return restores ? Need::Restoring : Need::Nothing;
 }
-// Room for the picture that is shown, to be handed over as red, green, blue and 255 for each pixel.
-QUABBLE_EXPORT(pictureBuffer) void* pictureBuffer(std::int32_t width, std::int32_t height) {
-    playing->machine.shown = Surface(width, height);
-    return playing->machine.shown.row(0).data();
-}
-// Does the next step. When something else is seen than it expects this is told, as a text that a zero ends.
+// Does the next step. When something else is seen than it expects this is told in the same way.
 QUABBLE_EXPORT(takeStep) const char* takeStep() {
     const VisitStep& step = playing->visit.steps[playing->next++];
     if (step.kind == VisitStep::Kind::Expect) {
@@ -87,8 +94,8 @@ QUABBLE_EXPORT(takeStep) const char* takeStep() {
         if (!isCompared || playing->steps.isAsExpected(step))
             return nullptr;
         const std::string line = "line " + std::to_string(step.line) + ": ";
-        playing->difference = line + differenceOf(step, playing->steps.seen(step));
-        return playing->difference.c_str();
+        told = line + differenceOf(step, playing->steps.seen(step));
+        return told.c_str();
     }
     playing->steps.act(step);
     running->program.wake();
