@@ -12,11 +12,10 @@
 #include "hosts/web/running.hpp"
 
 namespace quabble {
+namespace {
 
 std::unique_ptr<Running> running;
-std::string text;
-
-namespace {
+std::string text;  // what the page hands over
 
 WindowId idOf(std::uint32_t window) {
     return static_cast<WindowId>(window);
@@ -27,6 +26,13 @@ Page pageOf(std::int32_t width, std::int32_t height, double ratio) {
 }
 
 }  // namespace
+
+Running& runningNow() {
+    return *running;
+}
+const std::string& textHandedOver() {
+    return text;
+}
 
 // Makes room for a text of so many bytes, UTF-8, which the next call takes.
 QUABBLE_EXPORT(textBuffer) char* textBuffer(std::size_t size) {

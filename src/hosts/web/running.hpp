@@ -1,7 +1,6 @@
 #pragma once
 
 #include <cstdint>
-#include <memory>
 #include <string>
 
 #include "app/program.hpp"
@@ -24,7 +23,8 @@ struct Running {
     }
 };
 
-extern std::unique_ptr<Running> running;
-extern std::string text;  // what the page hands over
+// What the page has started, and the text that it handed over last.
+Running& runningNow();
+const std::string& textHandedOver();
 
 }  // namespace quabble

@@ -1,6 +1,9 @@
 // What the page's program has only for its tests: it reads the page's pictures, and plays visits in the page.
 // Their scripts make time pass and hand over what the canvas shows.
 
+#include <memory>
+#include <string>
+
 #include "hosts/headless/visit_steps.hpp"
 #include "hosts/web/running.hpp"
 
@@ -12,19 +15,19 @@ class PageMachine final : public VisitMachine {
  public:
     std::vector<ShownWindow> windows() const override {
         std::vector<ShownWindow> windows;
-        for (const auto& [id, frame] : running->frontEnd.windows())
+        for (const auto& [id, frame] : runningNow().frontEnd.windows())
             windows.push_back(
                 {id, frame.traits.clientSize, frame.traits.caption, frame.textArea.has_value()});
         if (!windows.empty())
-            windows.back().caption = text;
+            windows.back().caption = textHandedOver();
         return windows;
     }
     const Surface& picture() const override { return shown; }
-    void minimise(WindowId window) override { running->frontEnd.minimiseWindow(window); }
-    void restore(WindowId window) override { running->frontEnd.setMinimised(window, false); }
+    void minimise(WindowId window) override { runningNow().frontEnd.minimiseWindow(window); }
+    void restore(WindowId window) override { runningNow().frontEnd.setMinimised(window, false); }
     // The page becomes one with this scale, and with room enough.
     void rescale(Scale scale) override {
-        running->frontEnd.resize({.size = {4000, 4000}, .ratio = scale.quarters() / 8.0});
+        runningNow().frontEnd.resize({.size = {4000, 4000}, .ratio = scale.quarters() / 8.0});
     }
 
     Surface shown;
@@ -37,7 +40,7 @@ std::string told;
 struct Playing {
     Visit visit;
     std::size_t next = 0;  // step
-    VisitSteps steps{running->program, machine};
+    VisitSteps steps{runningNow().program, machine};
 
     const VisitStep& step() const { return visit.steps[next]; }
 };
@@ -52,17 +55,17 @@ QUABBLE_EXPORT(pictureBuffer) void* pictureBuffer(std::int32_t width, std::int32
 }
 // That picture in the words of a visit, as a text that a zero ends.
 QUABBLE_EXPORT(seenPicture) const char* seenPicture() {
-    told = VisitSteps(running->program, machine).seen({.what = std::string(expectations::picture)});
+    told = VisitSteps(runningNow().program, machine).seen({.what = std::string(expectations::picture)});
     return told.c_str();
 }
 
 // False while the page does not have all pictures.
 QUABBLE_EXPORT(canVisit) bool canVisit() {
-    return !running->frontEnd.programFile("BGIMG.BIG").empty();
+    return !runningNow().frontEnd.programFile("BGIMG.BIG").empty();
 }
 // The visit is the text that was handed over.
 QUABBLE_EXPORT(beginVisit) void beginVisit() {
-    auto read = parseVisit(text);
+    auto read = parseVisit(textHandedOver());
     playing = std::make_unique<Playing>(std::get<Visit>(std::move(read)));
     playing->steps.begin(playing->visit);
 }
@@ -98,7 +101,7 @@ QUABBLE_EXPORT(takeStep) const char* takeStep() {
         return told.c_str();
     }
     playing->steps.act(step);
-    running->program.wake();
+    runningNow().program.wake();
     return nullptr;
 }
 
