@@ -135,6 +135,8 @@ class Reader {
             return visit_.areWakesWritten = words.size() == 3 && words[1] == "as" && words[2] == "written";
         if (words.size() != 2)
             return false;
+        if (words[0] == "store")
+            return visit_.isStoreDamaged = words[1] == "damaged";
         if (words[0] == "scale") {
             const auto scale = scaleOf(words[1]);
             visit_.scale = scale.value_or(Scale());

@@ -34,6 +34,7 @@ struct Visit {
     std::uint64_t drawn = 0;  // random numbers that were drawn before
     Scale scale;
     std::array<std::array<std::int32_t, highScorePlaces>, highScoreTables> scores{};
+    bool isStoreDamaged = false;  // what an earlier run has kept cannot be read
     // Time passes only where a step says so, and the program is not woken in between.
     bool areWakesWritten = false;
     std::vector<VisitStep> steps;

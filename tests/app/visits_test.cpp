@@ -140,6 +140,7 @@ TEST(Visit, TellsWhichLineCannotBeUnderstood) {
                              "scores 4 1",
                              "scores 1 1 2 3 4 5 6 7 8 9",
                              "scores 1 a",
+                             "store new",
                              "wakes",
                              "expect",
                              "expect wonders",

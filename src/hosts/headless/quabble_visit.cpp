@@ -137,8 +137,7 @@ class Play {
         if (options_.refreshes)
             lines_[step.line - 1] = "expect " + step.what + refreshed(step, player.seen(step));
         else if ((!isPicture || options_.comparesPictures) && !player.isAsExpected(step))
-            return complain(step.line, step.what + ": \"" + step.value + "\" was expected, \"" +
-                                           player.seen(step) + "\" is seen");
+            return complain(step.line, differenceOf(step, player.seen(step)));
         return true;
     }
 

@@ -8,37 +8,11 @@
 #include <memory>
 #include <string>
 
-#include "app/program.hpp"
-#include "hosts/web/page_blob.hpp"
 #include "hosts/web/page_keys.hpp"
-#include "hosts/web/web_front_end.hpp"
-
-#define QUABBLE_EXPORT(name) extern "C" __attribute__((export_name(#name)))
+#include "hosts/web/running.hpp"
 
 namespace quabble {
 namespace {
-
-// All that lives as long as the page.
-struct Running {
-    WebFrontEnd frontEnd;
-    PageBlob blob;
-    BlobRegistryStore registry{blob};
-    Program program;
-    std::uint64_t picturesTold = 0;
-
-    Running(const Page& page, std::uint64_t seed) : frontEnd(page), program(frontEnd, registry, seed) {
-        frontEnd.connect([this](const InputEvent& event) { program.post(event); });
-    }
-
-    // What has become of the pictures is told in words, too.
-    void tell() {
-        const Window* window = program.topmostWindow();
-        if (window == nullptr || picturesTold == program.picturesShown())
-            return;
-        picturesTold = program.picturesShown();
-        frontEnd.tell(window->id(), window->describe());
-    }
-};
 
 std::unique_ptr<Running> running;
 std::string text;  // what the page hands over
@@ -54,6 +28,13 @@ Page pageOf(std::int32_t width, std::int32_t height, double ratio) {
 }
 
 }  // namespace
+
+Running& runningNow() {
+    return *running;
+}
+const std::string& textHandedOver() {
+    return text;
+}
 
 // Makes room for a text of so many bytes, UTF-8, which the next call takes.
 QUABBLE_EXPORT(textBuffer) char* textBuffer(std::size_t size) {

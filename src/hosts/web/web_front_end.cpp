@@ -181,6 +181,7 @@ bool WebFrontEnd::editsText(WindowId window) const {
 }
 
 void WebFrontEnd::setClipboardText(const std::string& text) {
+    clipboard_ = text;
     page::setClipboard(text.data(), text.size());
 }
 

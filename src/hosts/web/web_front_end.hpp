@@ -16,6 +16,13 @@ namespace quabble {
 // A page in a browser. Windows are frames within it, and a page that is hidden counts as minimised.
 class WebFrontEnd final : public FrontEnd {
  public:
+    struct Shown {
+        NativeWindow traits;
+        WindowPlace place;
+        bool isMinimised = false;
+        std::optional<Rect> textArea;
+    };
+
     explicit WebFrontEnd(const Page& page) : page_(page) {}
 
     // Where the program is posted what happens; to be set before the program starts.
@@ -36,6 +43,9 @@ class WebFrontEnd final : public FrontEnd {
     void moveMouse(WindowId window, Point at);
     void releaseMouse(WindowId window, Point at);
     bool editsText(WindowId window) const;
+
+    // The frames in the page, the topmost last.
+    const std::map<WindowId, Shown>& windows() const { return windows_; }
 
     // --- For those who do not see the pictures ---
 
@@ -58,16 +68,11 @@ class WebFrontEnd final : public FrontEnd {
     FileBytes programFile(std::string_view name) override;
     void say(std::string_view words) override { voice_.say(words); }
     void openDocument(std::string_view document) override;
-    // What is pasted comes as typed text.
+    // What was copied in the page. What other programs have copied comes as typed text when it is pasted.
+    std::string clipboardText() override { return clipboard_; }
     void setClipboardText(const std::string& text) override;
 
  private:
-    struct Shown {
-        NativeWindow traits;
-        WindowPlace place;
-        bool isMinimised = false;
-        std::optional<Rect> textArea;
-    };
     struct Press {
         WindowId window = WindowId::none;
         Point at;
@@ -85,6 +90,7 @@ class WebFrontEnd final : public FrontEnd {
     bool isHidden_ = false;
     std::map<WindowId, Shown> windows_;
     Press lastPress_;
+    std::string clipboard_;
     Voice voice_;
 };
 

@@ -1,6 +1,6 @@
 // What all stories share: a real browser, a visit to the page in it, and a player who sees the canvas.
 //   node tell.mjs BROWSER STORIES BUILD
-import {execFileSync} from 'node:child_process';
+import {spawnSync} from 'node:child_process';
 import {mkdtempSync, mkdirSync, readFileSync, rmSync, writeFileSync} from 'node:fs';
 import {createRequire} from 'node:module';
 import {tmpdir} from 'node:os';
@@ -23,7 +23,6 @@ const desktop = {width: 800, height: 640, ratio: 1};
 export const menu = {training: 1, timed: 2, strategy: 3, trainingTable: 4, timedTable: 5, strategyTable: 6, help: 7, exit: 8};
 /** How wide the windows' client areas are, in the program's pixels. */
 const widths = {'Quabble  Ver 1.0': 675, 'Game Statistics': 457, 'Best Score': 360, 'Best Scores - Quabble': 473};
-export const keys = {enter: 13, escape: 27};
 
 /** What does not hold is told in one sentence. */
 export function expect(isTrue, sentence) {
@@ -114,9 +113,32 @@ function watch() {
       hash = Math.imul(hash ^ ((data[i] << 16) | (data[i + 1] << 8) | data[i + 2]), 0x01000193);
     return hash >>> 0;
   };
-  seen.picture = () => fingerprint(0, 0, seen.top().width, seen.top().height);
+  seen.handOver = (bytes, place) => new Uint8Array(seen.exports.memory.buffer, place, bytes.length).set(bytes);
+  seen.textAt = (place) => {
+    const bytes = new Uint8Array(seen.exports.memory.buffer, place);
+    return new TextDecoder().decode(bytes.slice(0, bytes.indexOf(0)));
+  };
+  seen.handOverPicture = (canvas) => {
+    const {width, height} = canvas;
+    seen.handOver(canvas.getContext('2d').getImageData(0, 0, width, height).data, seen.exports.pictureBuffer(width, height));
+  };
+  /** What the canvas shows, in the words of a visit. */
+  seen.picture = () => (seen.handOverPicture(seen.top()), seen.textAt(seen.exports.seenPicture()));
   seen.cells = (left, top) => Array.from({length: 192}, (_, i) =>
     fingerprint(left + (i % 12) * 28, top + Math.floor(i / 12) * 28, 28, 28));
+  /** The place that the keyboard's ring is around, at scale 1: it has the only long white lines. */
+  seen.ring = () => {
+    const {width, height} = seen.top();
+    const pixels = new Uint32Array(seen.top().getContext('2d').getImageData(0, 0, width, height).data.buffer);
+    let ring = null;
+    for (let i = 0, run = 0; i < pixels.length; ++i) {
+      run = pixels[i] === 0xffffffff && i % width > 0 ? run + 1 : 0;
+      if (run < 10) continue;
+      const [x, y] = [i % width, Math.floor(i / width)];
+      ring = {...(ring ?? {left: x + 1 - run, top: y}), right: x + 1, bottom: y + 1};
+    }
+    return ring;
+  };
   window.seen = seen;
 }
 
@@ -204,9 +226,34 @@ export class Visit {
     }, x, y, client);
   }
   async click(x, y) {
+    if (this.hasNoMouse) {
+      await this.walkTo(x, y);
+      return this.clickByKey();
+    }
     await this.tab.mouse.click(...(await this.placeOf(x, y)));
     await this.tab.mouse.move(1, 1); // away from a window that appears there
     await this.#note(`click ${x} ${y}`);
+  }
+  /** Brings the keyboard's ring around a place, or to a column; each time half of the way. */
+  async walkTo(x, y) {
+    for (let tries = 0; tries < 50; ++tries) {
+      const {left, right, top, bottom} = (await this.see(() => window.seen.ring())) ?? {left: 0, right: 1e9, top: 0, bottom: 0};
+      const isInColumn = x >= left && x < right;
+      if (isInColumn && (y === undefined || (y >= top && y < bottom))) return;
+      const [way, size, keys] = isInColumn
+        ? [y - top, bottom - top, ['ArrowUp', 'ArrowDown']] : [x - left, right - left, ['ArrowLeft', 'ArrowRight']];
+      const steps = size === 0 ? 1 : Math.max(1, Math.floor(Math.abs(way) / size / 2)); // the first key only shows the ring
+      for (let step = 0; step < steps; ++step) await this.tab.keyboard.press(keys[way < 0 ? 0 : 1]);
+    }
+    throw new Error(`The keyboard does not lead to ${x}, ${y}.`);
+  }
+  /** With one after the other of the keys that click. */
+  async clickByKey() {
+    const keys = isFirefox ? ['Insert', 'Enter'] : ['Insert', 'Enter', 'ContextMenu']; // which cannot be pressed there
+    const key = keys[(this.keyClicks = (this.keyClicks ?? 0) + 1) % keys.length];
+    if (key === 'Enter') await this.tab.keyboard.down('Control');
+    await this.tab.keyboard.press(key);
+    if (key === 'Enter') await this.tab.keyboard.up('Control');
   }
   choose(button) {
     return this.click(337, 15 + 52 * button + 2);
@@ -215,9 +262,9 @@ export class Visit {
     await this.tab.keyboard.type(text);
     await this.#note(`type ${text}`);
   }
-  async press(key, code) {
+  async press(key) {
     await this.tab.keyboard.press(key);
-    await this.#note(`press ${code}`);
+    await this.#note(`key ${key.toLowerCase()}`);
   }
   async #note(act) {
     if (!this.isNoting) return;
@@ -259,20 +306,25 @@ export class Visit {
     await this.atRest();
     await this.click(95, 385); // End Game
     await this.untilWindow('Game Statistics');
-    await this.press('Enter', keys.enter);
+    await this.press('Enter');
     await this.untilWindow('Best Score');
   }
 
   /** Does all that was noted once more on the machine without a screen, where every picture must be the same. */
-  compare(quarters = 4, seed = 7) {
-    const [node, ...options] = [process.execPath, '--no-warnings', '--experimental-wasi-unstable-preview1'];
-    const runner = join(import.meta.dirname, '../../../cmake/run_wasi.mjs');
-    const output = execFileSync(node, [...options, runner, join(build, 'bin/headless_visit'), pictures, `${seed}`, `${quarters}`],
-      {input: this.acts.join('\n') + '\n', encoding: 'utf8'});
-    const expected = output.trim().split('\n').map(Number);
-    const differing = this.pictures.findIndex((picture, i) => picture !== null && picture !== expected[i]);
-    expect(differing < 0 && expected.length === this.pictures.length,
-      `After "${this.acts[differing]}", act ${differing + 1} of ${this.acts.length}, the page shows another picture than the machine without a screen.`);
+  compare() {
+    const [scale] = this.pictures.find((picture) => picture !== null).split(' ');
+    const lines = ['visit 1', 'seed 7', `scale ${scale}`];
+    for (const [i, act] of this.acts.entries()) {
+      if (act.startsWith('click')) lines.push(act.replace('click', `at ${i + 1}00s move`));
+      lines.push(`at ${i + 1}00s ${act}`, `at ${i + 1}50s`);
+      if (this.pictures[i] !== null) lines.push(`expect picture ${this.pictures[i]}`);
+    }
+    const file = join(newFolder(), 'noted.visit');
+    writeFileSync(file, `${lines.join('\n')}\n`);
+    const options = ['--no-warnings', '--experimental-wasi-unstable-preview1', join(import.meta.dirname, '../../../cmake/run_wasi.mjs')];
+    const {stdout} = spawnSync(process.execPath, [...options, join(build, 'bin/quabble-visit'), '--files', pictures, file], {encoding: 'utf8'});
+    const [, line] = /:(\d+):/.exec(stdout) ?? [];
+    expect(/\b0 of them/.test(stdout), `After "${lines[line - 3]}" the machine without a screen shows another picture than the page: ${stdout}`);
   }
 
   // --- The player ---
@@ -290,6 +342,7 @@ export class Visit {
   }
   /** Clicks a block of the largest cluster; false when there is none of that size. */
   async move(isTraining, smallest = isTraining ? 2 : 3) {
+    if (this.hasNoMouse) await this.walkTo(95); // to the panel, where the ring covers nothing
     const cluster = largestCluster(await this.untilBoard(isTraining));
     if (cluster.length < smallest) return false;
     const cell = cluster[0];

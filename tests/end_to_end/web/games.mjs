@@ -1,25 +1,33 @@
 // The games, from the menu to the table.
-import {expect, keys, menu, serveSite, until, Visit, wait} from './browser.mjs';
+import {expect, menu, serveSite, until, Visit, wait} from './browser.mjs';
 
 const site = await serveSite();
 export const leave = () => site.close();
 
+/** Once by the panel's button, and once by any key. */
+async function pauseByKeys(visit) {
+  await visit.walkTo(95);
+  const board = await visit.untilBoard(false);
+  const goOn = async () => {
+    await until('pause', async () => (await visit.board(false)).includes('?'));
+    await visit.clickByKey();
+    await visit.walkTo(95);
+    expect((await visit.untilBoard(false)) === board, 'After a pause the board is another one.');
+  };
+  await visit.click(95, 385);
+  await goOn();
+  await visit.tab.keyboard.press('p');
+  await visit.tab.keyboard.press('Enter'); // on the button that shows the game again
+  await goOn();
+}
+
 export default {
-  'a Training game to its end, and its place in the table after a reload': async (browser) => {
+  'a place in the table is there after a reload': async (browser) => {
     const visit = await Visit.open(browser, site.address);
     visit.isNoting = true;
-    await visit.choose(menu.training);
-    let moves = 0;
-    while (await visit.move(true)) {
-      if ((await visit.captions()).length > 1) break;
-      ++moves;
-    }
-    expect(moves > 10, `The game was over after ${moves} moves.`);
-    await visit.untilWindow('Game Statistics');
-    await visit.press('Enter', keys.enter);
-    await visit.untilWindow('Best Score');
+    await visit.untilName();
     await visit.type('Jürgen ☃');
-    await visit.press('Enter', keys.enter);
+    await visit.press('Enter');
     await visit.untilWindow('Best Scores - Quabble');
     const table = visit.pictures.at(-1);
     visit.compare();
@@ -31,18 +39,33 @@ export default {
     await visit.close();
   },
 
-  'moves of a Strategy game, at scale 1 and 2': async (browser) => {
-    for (const [ratio, width, height] of [[1, 800, 640], [2, 800, 640]]) {
-      const visit = await Visit.open(browser, site.address, {ratio, width, height});
-      visit.isNoting = true;
-      await visit.choose(menu.strategy);
-      for (let move = 0; move < 8; ++move) {
-        if (ratio === 1) await visit.move(false);
-        else await visit.click(246 + 28 * move, 450);
+  'a game of each mode to its end, its name and its table by keys alone': async (browser) => {
+    const visit = await Visit.open(browser, site.address);
+    visit.hasNoMouse = true;
+    const hasDialog = async () => (await visit.captions()).length > 1;
+    for (const mode of ['training', 'strategy', 'timed']) {
+      const isTraining = mode === 'training';
+      await visit.choose(menu[mode]);
+      for (let move = 0; (isTraining || move < 3) && (await visit.move(isTraining)); ++move) {
+        await (mode === 'timed' ? wait(500) : visit.atRest());
+        if (await hasDialog()) break;
       }
-      visit.compare(4 * ratio);
-      await visit.close();
+      if (mode === 'strategy') await pauseByKeys(visit);
+      if (!isTraining) await visit.walkTo(400, 518); // the next row, until there is no room for one
+      for (let row = 0; !isTraining && row < 40 && !(await hasDialog()); ++row) await visit.clickByKey();
+      await visit.untilWindow('Game Statistics');
+      await visit.click(230, 215);
+      await visit.untilWindow('Best Score');
+      await visit.tab.keyboard.type(`Joan of ${mode}`);
+      await visit.click(180, 170);
+      await visit.untilWindow('Best Scores - Quabble');
+      await visit.click(150, 420);
+      await until('menu', async () => !(await hasDialog()));
+      expect((await visit.kept()).includes(`Joan of ${mode}`), `The ${mode} table has no entry.`);
     }
+    await visit.choose(menu.exit);
+    await visit.ending();
+    await visit.close();
   },
 
   'rows push in from below by themselves in a Timed game': async (browser) => {

@@ -1,5 +1,5 @@
 // What lasts from one visit to the next, and what happens when it cannot.
-import {expect, keys, launch, menu, serveSite, until, Visit, wait} from './browser.mjs';
+import {expect, launch, menu, serveSite, until, Visit, wait} from './browser.mjs';
 
 const site = await serveSite();
 export const leave = () => site.close();
@@ -8,9 +8,9 @@ export const leave = () => site.close();
 async function enterName(visit, name) {
   await visit.untilName();
   await visit.type(name);
-  await visit.press('Enter', keys.enter);
+  await visit.press('Enter');
   await visit.untilWindow('Best Scores - Quabble');
-  await visit.press('Enter', keys.enter);
+  await visit.press('Enter');
   await until('menu', async () => (await visit.captions()).length === 1);
 }
 

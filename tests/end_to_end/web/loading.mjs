@@ -2,7 +2,7 @@
 import {cpSync, readFileSync, writeFileSync} from 'node:fs';
 import {join} from 'node:path';
 import {pathToFileURL} from 'node:url';
-import {expect, keys, menu, newFolder, pageFolder, serveSite, until, Visit} from './browser.mjs';
+import {expect, menu, newFolder, pageFolder, serveSite, until, Visit} from './browser.mjs';
 
 const site = await serveSite();
 export const leave = () => site.close();
@@ -57,8 +57,8 @@ export default {
     visit.isNoting = true;
     await visit.untilName();
     await visit.type('Zoë');
-    await visit.press('Enter', keys.enter);
-    await visit.press('Enter', keys.enter);
+    await visit.press('Enter');
+    await visit.press('Enter');
     visit.compare();
     visit.isNoting = false;
     await visit.tab.reload();
@@ -130,9 +130,9 @@ export default {
     const visit = await Visit.open(browser, site.address);
     await visit.untilName();
     await visit.type('Anna');
-    await visit.press('Enter', keys.enter);
+    await visit.press('Enter');
     await visit.untilWindow('Best Scores - Quabble');
-    await visit.press('Enter', keys.enter);
+    await visit.press('Enter');
     await until('menu', async () => (await visit.captions()).length === 1);
     for (const [i, breakIt] of breaks.entries()) {
       await visit.see(breakIt);
