@@ -1,5 +1,7 @@
 // The program's windows: frames on the desk, each with a canvas. Sizes and places are in device pixels.
 
+import {layRecordButton, recordButton} from './record.js';
+
 /**
  * @typedef {import('./program.js').Program} Program
  * @typedef {{frame: HTMLElement, bar: HTMLElement | null, canvas: HTMLCanvasElement, paint: CanvasRenderingContext2D,
@@ -102,6 +104,7 @@ export class Frames {
     const shown = [...this.#windows.values()];
     const isModal = shown.some((window) => window.owner !== 0);
     for (const window of shown) window.frame.inert = isModal && window !== shown.at(-1);
+    recordButton.inert = isModal;
   }
 
   /**
@@ -116,6 +119,7 @@ export class Frames {
     lay(shown.canvas, shown.client);
     if (shown.bar !== null) shown.bar.style.height = css(shown.client[1]);
     this.#sharpen(shown);
+    if (shown.bar !== null && shown.owner === 0) layRecordButton(shown.frame);
   }
 
   /** A picture that is shown one to one has sharp pixels; the others are only there until one that fits has come.
