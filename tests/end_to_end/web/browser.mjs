@@ -10,7 +10,7 @@ import {serve, addressOf} from '../../../src/hosts/web/serve.mjs';
 export const browserName = process.argv[2];
 const build = resolve(process.argv[4]);
 export const pageFolder = join(build, 'page');
-const pictures = join(build, 'program_files', 'bin');
+export const pictures = join(build, 'program_files', 'bin');
 const require = createRequire(join(build, 'src/hosts/web/tools/'));
 const puppeteer = require('puppeteer-core');
 export const {PNG} = require('pngjs');
@@ -44,6 +44,8 @@ export function newFolder() {
   folders.push(mkdtempSync(join(tmpdir(), 'quabble_page_')));
   return folders.at(-1);
 }
+/** Where the browsers put what is downloaded. */
+export const downloads = newFolder();
 export const removeFolders = () => folders.forEach((folder) => rmSync(folder, {recursive: true, force: true}));
 
 /**
@@ -69,6 +71,12 @@ export function launch({cookies = true, ratio} = {}) {
       '--no-sandbox', '--disable-gpu', '--disable-quic', '--no-first-run', '--disable-background-networking',
       '--disable-component-update', '--disable-sync'],
   });
+}
+
+/** Runs a program of the build, which is WebAssembly as well, and comes back with what it prints. */
+export function runProgram(name, words, input = '') {
+  const options = ['--no-warnings', '--experimental-wasi-unstable-preview1', join(import.meta.dirname, '../../../cmake/run_wasi.mjs')];
+  return execFileSync(process.execPath, [...options, join(build, 'bin', name), ...words], {input, encoding: 'utf8'});
 }
 
 /** The site, served by this machine; its address is `address`. */
@@ -128,7 +136,7 @@ export class Visit {
   /** Comes back when the menu is there, unless something else is to be waited for. */
   static async open(browser, address, {width, height, ratio, seed = 7, before, touch = false, context, until = 'menu'} = {}) {
     const visit = new Visit();
-    visit.#context = context ? null : await browser.createBrowserContext();
+    visit.#context = context ? null : await browser.createBrowserContext({downloadBehavior: {policy: 'allow', downloadPath: downloads}});
     visit.context = context ?? visit.#context;
     visit.tab = await visit.context.newPage();
     visit.watchTab(visit.tab);
@@ -263,10 +271,7 @@ export class Visit {
 
   /** Does all that was noted once more on the machine without a screen, where every picture must be the same. */
   compare(quarters = 4, seed = 7) {
-    const [node, ...options] = [process.execPath, '--no-warnings', '--experimental-wasi-unstable-preview1'];
-    const runner = join(import.meta.dirname, '../../../cmake/run_wasi.mjs');
-    const output = execFileSync(node, [...options, runner, join(build, 'bin/headless_visit'), pictures, `${seed}`, `${quarters}`],
-      {input: this.acts.join('\n') + '\n', encoding: 'utf8'});
+    const output = runProgram('headless_visit', [pictures, `${seed}`, `${quarters}`], this.acts.join('\n') + '\n');
     const expected = output.trim().split('\n').map(Number);
     const differing = this.pictures.findIndex((picture, i) => picture !== null && picture !== expected[i]);
     expect(differing < 0 && expected.length === this.pictures.length,

@@ -1,0 +1,96 @@
+// The record of the last game, as the page lets it be saved and as it is then played on the machine without a screen.
+import {existsSync, readFileSync, rmSync, writeFileSync} from 'node:fs';
+import {join} from 'node:path';
+import {pathToFileURL} from 'node:url';
+import {downloads, expect, keys, menu, pageFolder, pictures, runProgram, serveSite, until, Visit} from './browser.mjs';
+
+const site = await serveSite();
+export const leave = () => site.close();
+
+const file = join(downloads, 'last_game.visit');
+const scoreIn = (record) => Number(/^expect score (\d+)$/m.exec(record)[1]);
+
+/** Takes what the page offers, by the mouse. */
+async function save(visit) {
+  rmSync(file, {force: true});
+  await (await visit.tab.waitForSelector('#record', {visible: true})).click();
+  return until('whole record', () => {
+    const record = existsSync(file) ? readFileSync(file, 'utf8') : '';
+    return record.includes('expect level') && record;
+  });
+}
+
+/** Plays a record that ends with this picture, if there is one; the program says what differs. */
+function play(record, picture) {
+  writeFileSync(file, record + (picture ? `expect picture 1 ${picture}\n` : ''));
+  try {
+    runProgram('quabble-visit', ['--files', pictures, file]);
+  } catch (error) {
+    throw new Error(`The record comes to something else: ${error.stdout}`);
+  }
+}
+
+/** The fingerprint of the topmost window's picture as a visit has it, of 64 bits. */
+function pictureOf(visit) {
+  return visit.see(() => {
+    const {width, height} = window.seen.top();
+    const {data} = window.seen.top().getContext('2d').getImageData(0, 0, width, height);
+    let hash = 0xcbf29ce484222325n;
+    const add = (number) => (hash = BigInt.asUintN(64, (hash ^ BigInt(number)) * 0x100000001b3n));
+    add(width);
+    for (let i = 0; i < data.length; i += 4) add((data[i] << 16) | (data[i + 1] << 8) | data[i + 2]);
+    return hash.toString(16).padStart(16, '0');
+  });
+}
+
+async function begin(visit, moves) {
+  await visit.choose(menu.strategy);
+  for (let move = 0; move < moves; ++move) {
+    expect(await visit.move(false), 'There is no move.');
+    await visit.atRest();
+  }
+}
+
+export default {
+  'a game that was played in the page is played again from its record, to the same picture': async (browser) => {
+    for (const address of [site.address, pathToFileURL(join(pageFolder, 'quabble.html')).href]) {
+      const visit = await Visit.open(browser, address);
+      await begin(visit, 2);
+      await visit.tab.mouse.move(...(await visit.placeOf(300, 561))); // on its way
+      await visit.atRest();
+      const record = await save(visit);
+      expect(scoreIn(record) > 0, `After two moves there are ${scoreIn(record)} points in the record.`);
+      play(record, await pictureOf(visit));
+
+      await visit.tab.keyboard.press('q'); // still is the game's, and hides it
+      await (await visit.tab.waitForSelector('.minimised')).click();
+      await visit.click(400, 300);
+      await visit.click(95, 465); // End Game
+      await visit.untilWindow('Game Statistics');
+      expect(await visit.see(() => document.getElementById('record').inert), 'While a dialog is open the record takes input.');
+      for (const caption of ['Game Statistics', 'Best Score', 'Best Scores - Quabble']) {
+        await visit.untilWindow(caption);
+        await visit.press('Enter', keys.enter);
+      }
+      await until('menu', async () => (await visit.captions()).length === 1);
+      await visit.choose(menu.exit);
+      expect(/has ended/.test(await visit.ending()), 'The page does not say that the game has ended.');
+      const whole = await save(visit);
+      expect(scoreIn(whole) === scoreIn(record), `Of the last game, with ${scoreIn(record)} points, there are ${scoreIn(whole)} after its end.`);
+      play(whole);
+      await visit.close();
+    }
+  },
+
+  'a program that has failed still tells what led to it': async (browser) => {
+    const visit = await Visit.open(browser, site.address);
+    await begin(visit, 1);
+    await visit.see(() => void (TextEncoder.prototype.encode = () => ({length: -1}))); // no memory is as large
+    await visit.tab.keyboard.press('q');
+    expect(/went wrong/.test(await visit.ending()), 'Nobody says that something went wrong.');
+    const record = await save(visit);
+    expect(scoreIn(record) > 0, 'What was played is not in the record.');
+    play(record);
+    await visit.close({expected: /^$|RuntimeError|unreachable|JSHandle@(error|object)/});
+  },
+};
