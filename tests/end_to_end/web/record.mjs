@@ -51,7 +51,34 @@ async function begin(visit, moves) {
   }
 }
 
+/** What of the page the offer lies on; nothing when it is not offered. */
+function covered(visit) {
+  return visit.see(() => {
+    const areaOf = (element) => element.getBoundingClientRect();
+    const own = areaOf(document.getElementById('record'));
+    return own.width > 0 && ['.frame', '#hint', '#notice'].filter((name) => {
+      const {left, top, right, bottom} = areaOf(document.querySelector(name));
+      return left < own.right && own.left < right && top < own.bottom - 0.1 && own.top < bottom;
+    }).join();
+  });
+}
+
 export default {
+  'the offer covers nothing, on a desktop or a phone, and where there is no room it is not made': async (browser) => {
+    const visit = await Visit.open(browser, site.address);
+    for (const [width, height, isOffered, isOfferedBesideNotice] of
+      [[800, 640, true, false], [800, 600, false, false], [1000, 593, true, true], [390, 700, true, true], [844, 390, true, true]]) {
+      await visit.see(() => void (document.getElementById('notice').textContent = ''));
+      await visit.resize(width, height, 1);
+      await until(`page of ${width} by ${height}`, () => visit.see((width) => innerWidth === width, width));
+      const where = `On a page of ${width} by ${height}`;
+      await until(`answer, ${where}`, async () => (await covered(visit)) === (isOffered && ''));
+      await visit.see(() => void (document.getElementById('notice').textContent = 'Nothing can be kept.'));
+      await until(`answer beside a notice, ${where}`, async () => (await covered(visit)) === (isOfferedBesideNotice && ''));
+    }
+    await visit.close();
+  },
+
   'a game that was played in the page is played again from its record, to the same picture': async (browser) => {
     for (const address of [site.address, pathToFileURL(join(pageFolder, 'quabble.html')).href]) {
       const visit = await Visit.open(browser, address);
