@@ -78,8 +78,11 @@ Section Uninstall
   RMDir "$INSTDIR"
   Delete "$SMPROGRAMS\Quabble.lnk"
   DeleteRegKey HKCU "${KEY}"
-  MessageBox MB_YESNO|MB_ICONQUESTION|MB_DEFBUTTON2 "Remove the high scores and settings, too?" /SD IDNO IDNO kept
+  MessageBox MB_YESNO|MB_ICONQUESTION|MB_DEFBUTTON2 "Remove the high scores, the settings and the record of the last game, too?" /SD IDNO IDNO kept
   DeleteRegKey HKCU "Software\Vorlane\Quabble"
   DeleteRegKey /ifempty HKCU "Software\Vorlane"
+  Delete "$LOCALAPPDATA\Quabble\last_game.visit"
+  Delete "$LOCALAPPDATA\Quabble\last_game.new"
+  RMDir "$LOCALAPPDATA\Quabble"
   kept:
 SectionEnd

@@ -22,6 +22,8 @@ void Program::wake() {
     if (loop_.isTimeUp())
         recorder_.addWake(frontEnd_.now());
     loop_.wake();
+    if (!state_.game.mainMenuActive)
+        recorder_.beginAtMark();
 }
 
 Task<> Program::run() {
@@ -62,8 +64,8 @@ bool Program::requestEnd() {
     return isKept;
 }
 
-// A record begins anew with whatever is done at the menu while nothing else goes on: so it has the last game,
-// whichever it is, from the click that began it.
+// A record begins anew with what is done at the menu, while nothing else goes on, if a game begins with it:
+// so it has the last game from the click that began it, and what is done at the menu after that.
 void Program::record(const InputEvent& event) {
     if (state_.game.mainMenuActive && frmQuabble_ && loop_.modalWindow() == nullptr && loop_.isIdle())
         beginRecord(true);
@@ -88,7 +90,10 @@ void Program::beginRecord(bool isAtMenu) {
     const Window* window = isAtMenu ? frmQuabble_.get() : loop_.modalWindow();
     if (window != nullptr)
         start.scale = window->wantedScale();
-    recorder_.begin(start, frontEnd_.now());
+    if (isAtMenu)
+        recorder_.mark(start, frontEnd_.now());
+    else
+        recorder_.begin(start, frontEnd_.now());
 }
 
 void Program::writeVisit(const Recorder::Output& output) const {

@@ -53,13 +53,37 @@ std::int16_t codeOf(const InputEvent& event) {
     }
 }
 
+// When a visit starts that has its first act now, in whole microseconds.
+TimePoint baseOf(const Recorder::Start& start, TimePoint now) {
+    return std::chrono::floor<microseconds>(now) - (start.isAtMenu ? firstActAtMenu : microseconds(0));
+}
+
 }  // namespace
 
 void Recorder::begin(const Start& start, TimePoint now) {
     start_ = start;
-    base_ = now - (start.isAtMenu ? firstActAtMenu : microseconds(0));
+    base_ = baseOf(start, now);
     acts_.clear();
+    mark_.reset();
     isFull_ = false;
+}
+
+void Recorder::mark(const Start& start, TimePoint now) {
+    if (isFull_)
+        begin(start, now);
+    else
+        mark_ = {start, baseOf(start, now), acts_.size()};
+}
+
+void Recorder::beginAtMark() {
+    if (!mark_)
+        return;
+    acts_.erase(acts_.begin(), acts_.begin() + static_cast<std::ptrdiff_t>(mark_->firstAct));
+    for (Act& act : acts_)
+        act.at -= std::chrono::floor<microseconds>(mark_->base - base_);
+    start_ = mark_->start;
+    base_ = mark_->base;
+    mark_.reset();
 }
 
 void Recorder::add(const InputEvent& event, bool isBelow, TimePoint now, std::uint64_t picturesShown) {
@@ -69,6 +93,8 @@ void Recorder::add(const InputEvent& event, bool isBelow, TimePoint now, std::ui
         return;
     if (event.kind == EventKind::MouseMove && wasNothing)
         acts_.pop_back();
+    if (mark_)
+        mark_->firstAct = std::min(mark_->firstAct, acts_.size());
     picturesShown_ = picturesShown;
     acts_.push_back({.at = std::chrono::floor<microseconds>(now - base_),
                      .x = static_cast<std::int16_t>(event.x),

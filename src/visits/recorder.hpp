@@ -3,6 +3,7 @@
 #include <array>
 #include <cstdint>
 #include <functional>
+#include <optional>
 #include <string_view>
 #include <vector>
 
@@ -38,6 +39,10 @@ class Recorder {
     // Forgets what it has and begins anew.
     void begin(const Start& start, TimePoint now);
 
+    // The next game may begin here, as `beginAtMark` then says. Until it does, what came before is kept.
+    void mark(const Start& start, TimePoint now);
+    void beginAtMark();
+
     // An event comes for the topmost window or, with `isBelow`, for the one below it. `picturesShown` counts
     // what the program has shown up to now: a move of the mouse that changed nothing gives way to the next.
     void add(const InputEvent& event, bool isBelow, TimePoint now, std::uint64_t picturesShown);
@@ -67,9 +72,16 @@ class Recorder {
     static void writeAct(const Act& act, const Output& output);
     void writeStart(const Output& output) const;
 
+    struct Mark {
+        Start start;
+        TimePoint base;
+        std::size_t firstAct = 0;
+    };
+
     Start start_;
     TimePoint base_;  // when the visit starts
     std::vector<Act> acts_;
+    std::optional<Mark> mark_;
     std::uint64_t picturesShown_ = 0;  // when the last act was added
     bool isFull_ = false;
 };

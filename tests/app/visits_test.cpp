@@ -62,6 +62,16 @@ TEST(Record, PlaysTheLastGameOnceMore) {
              for (const EditCommand command : {EditCommand::Up, EditCommand::Right, EditCommand::Click})
                  machine.user.edit(command);
          }},
+        {"at the menu again",
+         [](Machine& machine) {
+             machine.user.wait(1s);
+             machine.clickPanel(machine.game.classicActive ? 8 : 10);
+             for (int dialog = 0; dialog < 3; ++dialog)
+                 machine.closeDialog();
+             machine.clickMenu(5);
+             machine.closeDialog();
+             machine.pointAtMenu(2);
+         }},
         {"at its table", [](Machine& machine) {
              machine.user.wait(1s);
              machine.clickPanel(machine.game.classicActive ? 8 : 10);
@@ -92,6 +102,7 @@ TEST(Record, PlaysTheLastGameOnceMore) {
             EXPECT_EQ(replay.picture == machine.user.top().picture, !hasName)
                 << "all is seen again but for the name";
             EXPECT_EQ(text.find("Jo"), std::string::npos);
+            EXPECT_EQ(text.find("drawn 0\n"), std::string::npos) << "the game before is not in it";
         }
     }
 }

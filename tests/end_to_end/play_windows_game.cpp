@@ -4,11 +4,16 @@
 
 #include <chrono>
 #include <cstdlib>
+#include <filesystem>
+#include <fstream>
 #include <functional>
+#include <iomanip>
 #include <map>
 #include <string>
+#include <thread>
 #include <vector>
 
+#include "draw/fingerprint.hpp"
 #include "robot.hpp"
 #include "window_stories.hpp"
 
@@ -77,6 +82,42 @@ void shortGame(const Command& command) {
     robot.closeAndCheckExit();
 }
 
+std::filesystem::path recordIn(const std::filesystem::path& users) {
+    for (const auto& user : std::filesystem::directory_iterator(users)) {
+        const auto file = user.path() / "AppData/Local/Quabble/last_game.visit";
+        if (std::filesystem::exists(file))
+            return file;
+    }
+    return {};
+}
+
+// The user saves a record by the window's menu, and whoever gets it sees what he has seen.
+void record(const Command& command) {
+    const std::filesystem::path settings = std::filesystem::path(std::getenv("XDG_CONFIG_HOME")) / "openbox";
+    std::filesystem::create_directories(settings);
+    std::ofstream(settings / "rc.xml") << "<openbox_config xmlns=\"http://openbox.org/3.4/rc\"/>";
+    run("openbox --reconfigure");  // which else has a menu of its own for Alt+Space
+    WindowStories story(command);
+    story.game().begin(GameMode::Strategy);
+    for (int move = 0; move < 3; ++move) {
+        story.beginMove();
+        std::this_thread::sleep_for(1s);
+    }
+    const std::uint64_t seen = fingerprintOf(story.game().look());
+    story.desktop().pressWith(XK_Alt_L, XK_space);
+    std::this_thread::sleep_for(500ms);
+    story.desktop().press(XK_l);
+    std::filesystem::path file;
+    waitUntil("a record", [&] {
+        return !(file = recordIn(std::filesystem::path(std::getenv("WINEPREFIX")) / "drive_c/users")).empty();
+    });
+    std::ofstream(file, std::ios::app)
+        << "expect picture 1 " << std::hex << std::setfill('0') << std::setw(16) << seen << "\n";
+    const auto player = std::filesystem::path(command.back()).parent_path() / "quabble-visit.exe";
+    run("wine '" + player.string() + "' '" + file.string() + "'");
+    story.close();
+}
+
 // The user logs off in the midst of a game, with a new score in the table.
 void logOff(const Command& command) {
     Robot robot(command);
@@ -93,11 +134,8 @@ void logOff(const Command& command) {
 
 int main(int argc, char** argv) {
     const std::map<std::string, std::function<void(const quabble::Command&)>> stories{
-        {"games", quabble::games},
-        {"windows", quabble::windows},
-        {"scales", quabble::scales},
-        {"short_game", quabble::shortGame},
-        {"log_off", quabble::logOff}};
+        {"games", quabble::games},          {"windows", quabble::windows}, {"scales", quabble::scales},
+        {"short_game", quabble::shortGame}, {"record", quabble::record},   {"log_off", quabble::logOff}};
     quabble::require(argc == 3 && stories.contains(argv[1]), "usage: play_windows_game STORY PROGRAM");
     stories.at(argv[1])({"wine", argv[2]});
     return 0;

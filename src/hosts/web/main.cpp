@@ -7,7 +7,9 @@
 #include <limits>
 #include <memory>
 #include <string>
+#include <string_view>
 
+#include "hosts/web/page.hpp"
 #include "hosts/web/page_keys.hpp"
 #include "hosts/web/running.hpp"
 
@@ -125,6 +127,12 @@ QUABBLE_EXPORT(nextDeadline) double nextDeadline() {
 }
 QUABBLE_EXPORT(keep) bool keep() {
     return running->program.keep();
+}
+// Hands the page the record of the last game. It may be called at any time, also when the program has failed.
+QUABBLE_EXPORT(writeRecord) void writeRecord() {
+    if (running)
+        running->program.writeVisit(
+            [](std::string_view line) { page::addToRecord(line.data(), line.size()); });
 }
 QUABBLE_EXPORT(ended) bool ended() {
     return running->program.ended();

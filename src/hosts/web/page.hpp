@@ -57,4 +57,7 @@ QUABBLE_PAGE("take") void take(void* to);
 QUABBLE_PAGE("setClipboard") void setClipboard(const char* text, std::size_t size);
 QUABBLE_PAGE("writeStorage") bool writeStorage(const void* bytes, std::size_t size);
 
+// One or more lines of the record of the last game.
+QUABBLE_PAGE("addToRecord") void addToRecord(const char* lines, std::size_t size);
+
 }  // namespace quabble::page

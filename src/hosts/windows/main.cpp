@@ -4,6 +4,7 @@
 #include "app/program.hpp"
 #include "hosts/windows/registry/win32.hpp"
 #include "hosts/windows/registry/windows_registry.hpp"
+#include "hosts/windows/visit_file.hpp"
 #include "hosts/windows/window_procedure.hpp"
 #include "hosts/windows/windows_front_end.hpp"
 
@@ -14,6 +15,7 @@ int WINAPI wWinMain(HINSTANCE, HINSTANCE, LPWSTR, int) {
     quabble::WindowsFrontEnd frontEnd;
     quabble::WindowsRegistryStore registry(HKEY_CURRENT_USER, "Software\\Vorlane\\Quabble\\1.0");
     quabble::Program program(frontEnd, registry, static_cast<std::uint64_t>(clock));
-    frontEnd.run(program);
+    const quabble::VisitFile record(program);
+    frontEnd.run(program, record);
     return EXIT_SUCCESS;
 }

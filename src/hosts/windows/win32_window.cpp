@@ -39,6 +39,15 @@ void setIcons(HWND window) {
     SendMessageW(window, WM_SETICON, ICON_SMALL, reinterpret_cast<LPARAM>(little));
 }
 
+// Chosen from the window's menu, which numbers what is not the system's below 0xF000, in steps of 16.
+constexpr UINT_PTR saveRecord = 0x0010;
+
+void addToMenu(HWND window) {
+    const HMENU menu = GetSystemMenu(window, FALSE);
+    AppendMenuW(menu, MF_SEPARATOR, 0, nullptr);
+    AppendMenuW(menu, MF_STRING, saveRecord, L"Save a record of the &last game");
+}
+
 // The corner from which a size lies in the middle of an area.
 Point centred(Size size, const Rect& area) {
     return {area.left + (area.width() - size.width) / 2, area.top + (area.height() - size.height) / 2};
@@ -72,6 +81,8 @@ Win32Window::Win32Window(WindowId id, const NativeWindow& traits, const Win32Win
     setTextInput(std::nullopt);
     if (above != nullptr)
         EnableWindow(above, FALSE);
+    else if (!traits.borderless)
+        addToMenu(handle_);
 }
 
 // An owner that cannot take the keyboard would leave it to another program.
@@ -252,9 +263,8 @@ std::optional<std::intptr_t> Win32Window::answerFrame(unsigned message, std::uin
         case WM_CLOSE:
             report({.kind = EventKind::CloseButton});
             return 0;
-        case WM_SYSCOMMAND:  // Alt or F10 alone would hold up the game in a menu that nobody sees
-            return (first & 0xFFF0) == SC_KEYMENU && second == 0 ? std::optional<std::intptr_t>(0)
-                                                                 : std::nullopt;
+        case WM_SYSCOMMAND:
+            return obeyMenu(first & 0xFFF0, second) ? std::optional<std::intptr_t>(0) : std::nullopt;
         case WM_GETDPISCALEDSIZE: {
             const auto dots = static_cast<unsigned>(first);
             const Size outer = outerSizeAround(sizeAt(factorAt(dots)), handle_, dots);
@@ -281,6 +291,14 @@ std::optional<std::intptr_t> Win32Window::answerFrame(unsigned message, std::uin
         default:
             return std::nullopt;
     }
+}
+
+// False when it is to do what it always does. Alt or F10 alone would hold up the game in a menu that nobody
+// sees.
+bool Win32Window::obeyMenu(std::uintptr_t command, std::intptr_t key) {
+    if (command == saveRecord)
+        listener_.recordIsWanted();
+    return command == saveRecord || (command == SC_KEYMENU && key == 0);
 }
 
 std::optional<std::intptr_t> Win32Window::answerInput(unsigned message, std::uintptr_t first,

@@ -23,6 +23,8 @@ class WindowListener {
     // The number of dots per inch of a screen, or its size, has changed: windows may be wanted at other
     // scales.
     virtual void screensHaveChanged() = 0;
+    // The user wants the record of the last game. As above, it is not to be written here and now.
+    virtual void recordIsWanted() = 0;
     // The user logs off: when it comes back the process may be ended.
     virtual void sessionEnds() = 0;
 };
@@ -59,6 +61,7 @@ class Win32Window {
     std::optional<std::intptr_t> answer(unsigned message, std::uintptr_t first, std::intptr_t second);
     std::optional<std::intptr_t> answerFrame(unsigned message, std::uintptr_t first, std::intptr_t second);
     std::optional<std::intptr_t> answerInput(unsigned message, std::uintptr_t first, std::intptr_t second);
+    bool obeyMenu(std::uintptr_t command, std::intptr_t key);
     void report(InputEvent event);
     void reportPointer(EventKind kind, std::uintptr_t buttons, std::intptr_t place);
     void reportSize(std::uintptr_t how);

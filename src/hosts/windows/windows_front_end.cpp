@@ -12,13 +12,15 @@
 
 namespace quabble {
 
-void WindowsFrontEnd::run(Program& program) {
+void WindowsFrontEnd::run(Program& program, const VisitFile& record) {
     program_ = &program;
     program.start();
     while (!program.ended()) {
         leaving_.reset();
         waitForMessages();
         program.wake();
+        if (std::exchange(isRecordWanted_, false))
+            saveRecord(record);
     }
     program_ = nullptr;
 }
@@ -38,6 +40,15 @@ void WindowsFrontEnd::waitForMessages() {
         TranslateMessage(&message);
         DispatchMessageW(&message);
     }
+}
+
+// The user is shown the folder, to send the file to whom he likes.
+void WindowsFrontEnd::saveRecord(const VisitFile& record) const {
+    if (record.write())
+        openByShell(record.folder());
+    else if (!windows_.empty())
+        MessageBoxW(windows_.begin()->second->handle(), L"The record could not be written.", L"Quabble",
+                    MB_OK | MB_ICONWARNING);
 }
 
 void WindowsFrontEnd::report(const InputEvent& event) {

@@ -9,6 +9,7 @@
 
 #include "app/program.hpp"
 #include "hosts/windows/message_wait.hpp"
+#include "hosts/windows/visit_file.hpp"
 #include "hosts/windows/win32_window.hpp"
 #include "platform/front_end.hpp"
 
@@ -18,8 +19,8 @@ namespace quabble {
 class WindowsFrontEnd final : public FrontEnd, private WindowListener {
  public:
     // Starts the program, waits for the system's messages and passes them on, until the program has ended.
-    // The windows' class is there.
-    void run(Program& program);
+    // The record is written when the user wants it. The windows' class is there.
+    void run(Program& program, const VisitFile& record);
 
     TimePoint now() override { return Clock::now(); }
     Scale createWindow(WindowId window, const NativeWindow& traits) override;
@@ -37,10 +38,12 @@ class WindowsFrontEnd final : public FrontEnd, private WindowListener {
  private:
     void report(const InputEvent& event) override;
     void screensHaveChanged() override;
+    void recordIsWanted() override { isRecordWanted_ = true; }
     void sessionEnds() override;
 
     void waitForMessages();
     bool continuesClick();
+    void saveRecord(const VisitFile& record) const;
     Win32Window* find(WindowId window);
 
     Program* program_ = nullptr;  // that runs
@@ -48,6 +51,7 @@ class WindowsFrontEnd final : public FrontEnd, private WindowListener {
     std::unique_ptr<Win32Window> leaving_;
     std::vector<WindowId> unopened_;  // for want of a window; they close at once
     MessageWait messageWait_;
+    bool isRecordWanted_ = false;
     struct Press {
         long time;  // milliseconds, by the system's messages
         Point place;

@@ -1,5 +1,6 @@
 // The program's windows: frames on the desk, each with a canvas. Sizes and places are in device pixels.
 
+import {layRecordButton, recordButton} from './record.js';
 import {Spoken} from './spoken.js';
 import {TextField} from './text_field.js';
 
@@ -106,6 +107,7 @@ export class Frames {
     const shown = [...this.#windows.values()];
     const isModal = shown.some((window) => window.owner !== 0);
     for (const window of shown) window.frame.inert = isModal && window !== shown.at(-1);
+    recordButton.inert = isModal;
   }
 
   /**
@@ -121,6 +123,7 @@ export class Frames {
     lay(shown.spoken.element, shown.client);
     if (shown.bar !== null) shown.bar.style.height = css(shown.client[1]);
     this.#sharpen(shown);
+    if (shown.bar !== null && shown.owner === 0) layRecordButton(shown.frame);
   }
 
   /** A picture that is shown one to one has sharp pixels; the others are only there until one that fits has come.

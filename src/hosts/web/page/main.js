@@ -5,6 +5,7 @@ import {showHelp} from './help.js';
 import {Keeping} from './keeping.js';
 import {backdrop, filesOf, isOneFile, program as loadProgram} from './parts.js';
 import {Program} from './program.js';
+import {offerRecordOf, recordButtonAtEnd} from './record.js';
 
 const helpPage = 'QB_HELP.HTM';
 const desk = /** @type {HTMLElement} */ (document.getElementById('desk'));
@@ -23,7 +24,7 @@ function showEnd(sentence) {
   const button = document.createElement('button');
   button.textContent = 'Start again';
   button.addEventListener('click', () => location.reload());
-  end.append(text, button);
+  end.append(text, button, recordButtonAtEnd());
   desk.replaceChildren(end);
   notice.textContent = '';
   button.focus();
@@ -72,6 +73,7 @@ async function play() {
     closed: keep, // a name may have been entered, which is not to be lost when something goes wrong later
     open,
   });
+  offerRecordOf(program);
   document.addEventListener('visibilitychange', () => {
     program.call('setHidden', document.hidden);
     if (document.hidden) keep();

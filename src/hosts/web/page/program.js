@@ -16,6 +16,7 @@ export class Program {
   #hasClosedDialog = false;
   #failure = /** @type {unknown} */ (null); // of something that the program asked for
   #asked = /** @type {Uint8Array} */ (new Uint8Array());
+  #record = '';
   /** What was cut or copied last. */
   clipboard = '';
 
@@ -88,6 +89,17 @@ export class Program {
     this.call('keep');
   }
 
+  /** What was done since the last game began; nothing when there is no program, or one that cannot even tell that. */
+  record() {
+    this.#record = '';
+    try {
+      this.#exports.writeRecord();
+    } catch (error) {
+      console.warn('The record is not whole.', error);
+    }
+    return this.#record;
+  }
+
   #settle() {
     clearTimeout(this.#alarm);
     if (this.#exports.ended()) {
@@ -158,6 +170,7 @@ export class Program {
       take: (to) => this.bytesAt(to, this.#asked.length).set(this.#asked),
       setClipboard: (text, size) => void (this.clipboard = this.#textAt(text, size)),
       writeStorage: (bytes, size) => this.keeping.write(this.bytesAt(bytes, size).slice()),
+      addToRecord: (lines, size) => void (this.#record += this.#textAt(lines, size)),
     };
     for (const [name, act] of Object.entries(page)) {
       page[name] = (...values) => {
