@@ -69,10 +69,11 @@ void Recorder::begin(const Start& start, TimePoint now) {
 }
 
 void Recorder::mark(const Start& start, TimePoint now) {
-    if (isFull_)
-        begin(start, now);
-    else
-        mark_ = {start, baseOf(start, now), acts_.size()};
+    if (acts_.size() > mostActs) {
+        acts_.resize(mostActs);
+        isFull_ = true;
+    }
+    mark_ = {start, baseOf(start, now), acts_.size()};
 }
 
 void Recorder::beginAtMark() {
@@ -84,6 +85,7 @@ void Recorder::beginAtMark() {
     start_ = mark_->start;
     base_ = mark_->base;
     mark_.reset();
+    isFull_ = false;
 }
 
 void Recorder::add(const InputEvent& event, bool isBelow, TimePoint now, std::uint64_t picturesShown) {
@@ -111,16 +113,20 @@ void Recorder::addWake(TimePoint now) {
         acts_.push_back({.at = std::chrono::floor<microseconds>(now - base_), .isWake = true});
 }
 
-// Once it is full it stays so, for what comes later means nothing without what was left out.
+// Once it is full it stays so, for what comes later means nothing without what was left out. Only the acts
+// that begin the next game have a place beyond.
 bool Recorder::hasRoom() {
-    isFull_ = isFull_ || acts_.size() == mostActs;
-    return !isFull_;
+    const bool hasRoom =
+        acts_.size() < mostActs || (mark_ && acts_.size() < mark_->firstAct + mostActsOfABeginning);
+    isFull_ = isFull_ || !hasRoom;
+    return hasRoom;
 }
 
 void Recorder::write(const Figures& figures, const Output& output) const {
     writeStart(output);
-    for (const Act& act : acts_)
-        writeAct(act, output);
+    const std::size_t written = isFull_ ? std::min(acts_.size(), mostActs) : acts_.size();
+    for (std::size_t i = 0; i < written; ++i)
+        writeAct(acts_[i], output);
     if (isFull_) {
         output("# There was more.\n");
         return;

@@ -67,6 +67,7 @@ class Recorder {
         bool continuesClick = false;
     };
     static constexpr std::size_t mostActs = 40'000;
+    static constexpr std::size_t mostActsOfABeginning = 100;
 
     bool hasRoom();
     static void writeAct(const Act& act, const Output& output);

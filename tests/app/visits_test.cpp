@@ -119,6 +119,14 @@ TEST(Record, IsShortWhileNothingHappens) {
     EXPECT_LT(text.size(), 2'000'000U);
     EXPECT_TRUE(text.ends_with("# There was more.\n"));
     EXPECT_EQ(Replay(text).problem, "");
+    machine.clickPanel(8);
+    machine.closeDialog();
+    for (int i = 0; i < 500; ++i)
+        machine.pointAtMenu(1 + i % 8);
+    EXPECT_EQ(recordOf(machine.program), text) << "and it is kept until another game begins";
+    machine.clickMenu(2);
+    EXPECT_EQ(Replay(recordOf(machine.program)).problem, "");
+    EXPECT_TRUE(recordOf(machine.program).ends_with("expect level 1\n"));
 }
 
 TEST(Visit, TellsWhichLineCannotBeUnderstood) {
