@@ -1,6 +1,5 @@
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <functional>
 
 #include "machine.hpp"
@@ -167,27 +166,6 @@ TEST(TimedGame, BeginsItsFirstRowAnewAfterAGameThatEndedInMidRow) {
     EXPECT_EQ(machine.game.rowsEntered, 0);
     machine.user.wait(1ms);
     EXPECT_EQ(machine.game.rowsEntered, 1);
-}
-
-TEST(Dialogs, HaveOneOkButtonAndARingAroundItWhileItHasTheFocus) {
-    Machine machine;
-    machine.app.highScores.table(1) = {};
-    machine.start(1, cluster);
-    machine.clickCell(5, 16);
-    machine.user.wait(1s);
-    machine.clickPanel(8);
-    Surface inResult(90, 30);
-    inResult.copy(inResult.bounds(), machine.user.top().picture, {186, 204});
-    machine.closeDialog();
-    for (const Colour around : {palette::backgroundColour, palette::valueColour}) {
-        const Surface& picture = machine.user.top().picture;
-        Surface inNameEntry(90, 30);
-        inNameEntry.copy(inNameEntry.bounds(), picture, {135, 156});
-        EXPECT_TRUE(inNameEntry == inResult);
-        for (const Point at : {Point{133, 154}, {134, 170}, {180, 187}, {226, 187}})
-            EXPECT_EQ(picture.at(at.x, at.y), around) << at.x;
-        machine.user.press(keys::tab);
-    }
 }
 
 }  // namespace

@@ -1,10 +1,6 @@
 #include <gtest/gtest.h>
 
-#include <functional>
-
-#include "../end_to_end/player.hpp"
 #include "machine.hpp"
-#include "platform/places.hpp"
 
 namespace quabble {
 namespace {
@@ -34,8 +30,6 @@ struct KeyboardMachine : Machine {
         return ring;
     }
 
-    std::vector<Point> way;  // where the pointer has been
-
     // Goes across first, then up or down, until the ring holds the point.
     void walkTo(std::int32_t x, std::int32_t y) {
         if (ring().isEmpty())
@@ -43,7 +37,6 @@ struct KeyboardMachine : Machine {
         int steps = 0;
         for (Rect at = ring(); !at.contains(x, y); at = ring()) {
             ASSERT_LT(++steps, 40) << "on the way to " << x << ", " << y;
-            way.push_back(middleOf(at));
             if (x < at.left)
                 user.edit(EditCommand::Left);
             else if (x >= at.right)
@@ -57,44 +50,6 @@ struct KeyboardMachine : Machine {
         user.edit(EditCommand::Click);
     }
 };
-
-// The mouse then comes to where the keys have brought the pointer, and the ring goes: the very picture stays.
-TEST(Keyboard, ShowsWhatTheMouseShowsAndARing) {
-    struct Screen {
-        const char* name;
-        std::function<void(Machine&)> show;
-        std::vector<Point> places;
-    };
-    const Screen screens[] = {
-        {"menu", [](Machine&) {}, {{337, 67}, {337, 330}, {337, 435}}},
-        {"training", [](Machine& machine) { machine.clickMenu(1); }, {{95, 305}, {95, 385}, {246, 51}}},
-        {"strategy", [](Machine& machine) { machine.clickMenu(3); }, {{400, 518}, {95, 465}, {554, 465}}},
-        {"paused", [](Machine& machine) { machine.clickMenu(2), machine.clickPanel(8); }, {{337, 281}}},
-        {"result", [](Machine& machine) { machine.clickMenu(2), machine.clickPanel(10); }, {{231, 219}}},
-        {"scores", [](Machine& machine) { machine.clickMenu(5); }, {{157, 420}, {337, 420}}}};
-    for (const Scale scale : {Scale(), Scale::ofQuarters(6)}) {
-        for (const Screen& screen : screens) {
-            KeyboardMachine machine(7, Scale()), withMouse(7, scale);
-            screen.show(machine);
-            screen.show(withMouse);
-            for (const Point place : screen.places) {
-                SCOPED_TRACE(testing::Message() << screen.name << " at " << place.x << ", " << place.y);
-                machine.walkTo(place.x, place.y);
-                const PointerShape shape = machine.user.top().pointer;
-                machine.frontEnd.rescale(scale);
-                machine.program.wake();
-                machine.user.movePointer(static_cast<float>(place.x), static_cast<float>(place.y));
-                machine.way.push_back(place);
-                for (const Point at : std::exchange(machine.way, {}))
-                    withMouse.user.movePointer(static_cast<float>(at.x), static_cast<float>(at.y));
-                EXPECT_EQ(shape, withMouse.user.top().pointer);
-                EXPECT_TRUE(machine.user.top().picture == withMouse.user.top().picture);
-                machine.frontEnd.rescale(Scale());
-                machine.program.wake();
-            }
-        }
-    }
-}
 
 TEST(Keyboard, StepsFromPlaceToPlace) {
     KeyboardMachine machine;

@@ -1,13 +1,15 @@
 #include <gtest/gtest.h>
 
+#include "../engine/board_notation.hpp"
 #include "../support/large_picture_file.hpp"
 #include "draw/bitmap_file.hpp"
 #include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/pictures.hpp"
 #include "gfx/result_dialog.hpp"
+#include "gfx/spoken_words.hpp"
 #include "gfx/string_table.hpp"
-#include "hosts/headless/scripted_user.hpp"
+#include "hosts/headless/headless_front_end.hpp"
 
 namespace quabble {
 namespace {
@@ -19,50 +21,9 @@ class Painters : public testing::Test {
             sheet.row(static_cast<std::int32_t>(i / 400))[i % 400] = i | pixel_layout::opaque;
     }
     Surface sheet{400, 838};  // every pixel is another one
-    static constexpr Font font{Typeface::SansBold, 14};
     Canvas drawn{{360, 470}, Scale()};
     Surface expected{360, 470};
-    ScreenButton box{20, 10, 70, 24, false, palette::backgroundBrush, {}, {250, 240, 10}, font};
-    CellBox cells{20, 10, 28};
 };
-
-TEST_F(Painters, ClipEachCopyOfATextToItsOwnRectangle) {
-    constexpr const char* text = "Wider lines\nof text jump";
-    for (const std::int32_t format : {-1, 1, 4 + 32, 1 + 4 + 32}) {
-        const bool label = format == 1 + 4 + 32;
-        expected.fill({20, 10, 90, 34}, {62, 105, 214});
-        drawText(expected, Scale(), {20, 10, 90, 34}, text, std::max(format, 0), {}, font);
-        drawText(expected, Scale(), label ? Rect{20, 10, 97, 27} : Rect{27, 3, 90, 34}, text,
-                 std::max(format, 0), label ? Colour{200, 220, 180} : Colour{250, 240, 10}, font);
-        drawLabelledBox(drawn, box, BoxStyle::Plain, label, 7, label ? text : "");
-        if (!label)
-            drawShadowText(drawn, box, 7, text, format);
-        EXPECT_TRUE(drawn.picture() == expected) << format;
-    }
-}
-
-TEST_F(Painters, CopyTheTilesOfTheBoardAndTheWaitingRow) {
-    PlayGrid grid;
-    grid.recreate(12, 16);
-    grid.forEachCell([&](CellPosition place, GridCell& cell) {
-        cell.tile = static_cast<std::int16_t>((place.column + 5 * place.row) % 14);
-        const Rect square = Rect::ofSize(28 * place.column - 8, 28 * place.row - 18, 28, 28);
-        expected.copy(square, sheet, {28 * cell.tile, 0});
-    });
-    drawBoard(drawn, cells, spritesOf(sheet, Scale()), grid);
-    EXPECT_TRUE(drawn.picture() == expected);
-    sheet.fill({252, 0, 280, 28}, {0x12, 0x34, 0x56});
-    sheet.fill({0, 28, 28, 56}, {0, 0, 0xF0});
-    for (const auto& [revealed, hidden] : {std::pair{0, 11}, {4, 7}, {10, 1}, {11, 0}}) {
-        for (std::int32_t i = 0; i < 12; ++i)
-            expected.fill(Rect::ofSize(20 + 28 * i, 10, 28, 28), {0x12, 0x34, 0x56});
-        for (std::int32_t i = 0; i < hidden; ++i)
-            expected.fill(Rect::ofSize(20 + 28 * i, 10, 28, 28), {0, 0, 0x50});
-        drawPreviewRow(drawn, cells, spritesOf(sheet, Scale()), GridRow(12, GridCell::bomb(3)),
-                       static_cast<std::int16_t>(revealed));
-        EXPECT_TRUE(drawn.picture() == expected) << revealed;
-    }
-}
 
 TEST_F(Painters, FillTheGaugeFromTheTopAndCopyNoMoreThanThereIs) {
     const Sprites sprites = spritesOf(sheet, Scale());
@@ -73,7 +34,7 @@ TEST_F(Painters, FillTheGaugeFromTheTopAndCopyNoMoreThanThereIs) {
         EXPECT_TRUE(drawn.picture() == expected) << part;
     }
     expected.fill({20, 10, 25, 15}, {});
-    drawn.copy(box.rect(), Surface(5, 5));
+    drawn.copy(Rect::ofSize(20, 10, 70, 24), Surface(5, 5));
     EXPECT_TRUE(drawn.picture() == expected) << "a picture smaller than its box";
 }
 
@@ -156,6 +117,23 @@ TEST(Sprites, AreMadeFromALargeVersionThatIsWholeAndBelongsToTheSheet) {
     EXPECT_FALSE(isFine(sheet, {}));
 }
 
+TEST(SpokenWords, TellWhatIsInACellAndHowManyAClickWouldTake) {
+    const auto places = boardPlaces({200, 30, 28}, board("..S/.1a1/221.4"));
+    ASSERT_EQ(places.size(), 192U);
+    const std::tuple<std::size_t, std::size_t, const char*> cells[] = {{3, 14, "stone"},
+                                                                       {3, 15, "bomb for every coral disc"},
+                                                                       {4, 15, "coral disc, cluster of 4"},
+                                                                       {1, 16, "mint diamond, cluster of 2"},
+                                                                       {4, 16, "empty"},
+                                                                       {5, 16, "violet cross, cluster of 1"}};
+    for (const auto& [column, row, words] : cells) {
+        const Place& place = places[12 * (row - 1) + column - 1];
+        EXPECT_EQ(place.words,
+                  "column " + std::to_string(column) + ", row " + std::to_string(row) + ": " + words);
+        EXPECT_EQ(place.area.left, 200 + 28 * static_cast<std::int32_t>(column - 1));
+    }
+}
+
 TEST(Texts, KeysAreReplacedPairByPair) {
     EXPECT_EQ(fillText("|1-|1|", {"|1", 7}), "7-7|");
     EXPECT_EQ(fillText("|1 |2", {"|1", "|2", "|2", 5}), "5 5");
@@ -166,22 +144,14 @@ TEST(Texts, KeysAreReplacedPairByPair) {
     EXPECT_EQ(loadString(90), "End game");
 }
 
-class Result : public testing::Test {
- protected:
-    std::string textOf(GameMode mode, std::int16_t level, bool goNextLevel) {
-        game.gameMode = mode;
-        game.stats = {120, 14, 6, level, 999};
-        return resultText(game, goNextLevel);
-    }
+std::string textOf(GameMode mode, std::int16_t level, bool goNextLevel) {
     GameState game;
-    HeadlessFrontEnd frontEnd;
-    MessageLoop loop{frontEnd};
-    ScriptedUser<MessageLoop> user{frontEnd, loop};
-    Window owner{loop};
-    ResultDialog dialog{loop, owner, game, 45};
-};
+    game.gameMode = mode;
+    game.stats = {120, 14, 6, level, 999};
+    return resultText(game, goNextLevel);
+}
 
-TEST_F(Result, TellsHowTheGameOrLevelEnded) {
+TEST(Result, TellsHowTheGameOrLevelEnded) {
     const std::string done = "Congrats ! You have finished all levels !", over = "Game Over";
     const std::string figures = "  Number of Blocks Cleared 14 \n  Largest Cluster 6 \n";
     const std::string score = "\r\nscore : 120 \n", level = score + " Current Level 10 \n" + figures;
@@ -196,40 +166,6 @@ TEST_F(Result, TellsHowTheGameOrLevelEnded) {
         EXPECT_EQ(textOf(GameMode::Strategy, number, goNextLevel), strategy);
     }
     EXPECT_EQ(textOf(GameMode::Training, 1, false), over + score + figures);
-}
-
-TEST_F(Result, ShowsItsLinesWholeAndHighlightsItsButtonUntilItCloses) {
-    Canvas expected({457, 265}, Scale());
-    using enum EventKind;
-    const std::pair<EventKind, short> ways[] = {
-        {MouseDown, 0}, {CloseButton, 0}, {KeyPress, 13}, {KeyPress, 27}};
-    const float path[][2] = {{230, 234}, {230, 233}, {187, 219}, {186, 219}, {230, 204}, {230, 205}};
-    const std::string lines = textOf(GameMode::Strategy, 11, false);
-    expected.write({47, 43, 418, 999}, lines, 1, {Typeface::Sans, 12}, {180, 180, 140});
-    for (const auto& way : ways) {
-        Task<> showing = loop.showModal(dialog);
-        showing.start();
-        int timesShown = 1, hovered = 0;
-        for (const auto& [x, y] : path) {
-            const bool over = y > 204 && y < 234 && x > 186 && x < 276;
-            timesShown += over != std::exchange(hovered, over);
-            const Colour colour = over ? Colour{200, 220, 180} : Colour{180, 180, 140};
-            const Rect front{186, 204, over ? 284 : 282, over ? 226 : 228};
-            expected.fill({186, 204, 276, 234}, {62, 105, 214});
-            expected.outline({186, 204, 276, 234}, {170, 170, 100});
-            expected.outline(over ? Rect{187, 205, 275, 233} : Rect{}, colour);
-            expected.write({186, 204, 276, 234}, "OK", 1 + 4 + 32, {Typeface::Sans, 14}, {});
-            expected.write(front, "OK", 1 + 4 + 32, {Typeface::Sans, 14}, colour);
-            user.movePointer(x, y);
-            EXPECT_EQ(user.top().timesShown, timesShown) << x << "," << y;
-            EXPECT_TRUE(user.top().picture == expected.picture()) << x << "," << y;
-            loop.post({user.topWindow(), over ? KeyPress : MouseDown, x, y, 'o'});
-        }
-        loop.post({user.topWindow(), way.first, 186.5F, 204.5F, way.second});
-        loop.wake();
-        EXPECT_TRUE(showing.done()) << way.second;
-        EXPECT_TRUE(frontEnd.windows().empty()) << way.second;
-    }
 }
 
 }  // namespace

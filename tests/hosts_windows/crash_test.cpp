@@ -1,6 +1,7 @@
 #include <cstdlib>
 #include <string>
 
+#include "child_process.hpp"
 #include "registry_fixture.hpp"
 
 // Where the linker has put the addresses of the system's functions that change a registry.
@@ -62,17 +63,7 @@ class CrashTest : public WindowsRegistryFixture {
     bool dieSaving(int step) const {
         SetEnvironmentVariableA(stepVariable, std::to_string(step).c_str());
         SetEnvironmentVariableW(placeVariable, place.path.c_str());
-        std::wstring command = std::wstring(GetCommandLineW()) +
-                               L" --gtest_also_run_disabled_tests --gtest_filter=*DISABLED_SaveTwoAndDie";
-        STARTUPINFOW start{};
-        start.cb = sizeof start;
-        PROCESS_INFORMATION child{};
-        CreateProcessW(nullptr, command.data(), nullptr, nullptr, FALSE, 0, nullptr, nullptr, &start, &child);
-        WaitForSingleObject(child.hProcess, INFINITE);
-        DWORD status = 0;
-        GetExitCodeProcess(child.hProcess, &status);
-        CloseHandle(child.hProcess), CloseHandle(child.hThread);
-        return status != 0;
+        return runInChild(L"DISABLED_SaveTwoAndDie") != 0;
     }
     void beginWith(std::int16_t old) {
         RegDeleteTreeW(place.root, L"Software\\Vorlane");

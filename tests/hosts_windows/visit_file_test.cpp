@@ -9,8 +9,8 @@
 #include <iterator>
 #include <utility>
 
+#include "child_process.hpp"
 #include "hosts/headless/visit_player.hpp"
-#include "hosts/windows/registry/win32.hpp"
 
 // Where the linker has put the address of the system's function that writes to a file.
 extern "C" decltype(&WriteFile) __imp_WriteFile;
@@ -86,17 +86,7 @@ TEST(VisitFileChild, DISABLED_BreakAnInvariant) {
 
 TEST_F(VisitFileTest, ABrokenInvariantWritesTheRecord) {
     fs::create_directory(folder);
-    std::wstring command = std::wstring(GetCommandLineW()) +
-                           L" --gtest_also_run_disabled_tests --gtest_filter=*DISABLED_BreakAnInvariant";
-    STARTUPINFOW start{};
-    start.cb = sizeof start;
-    PROCESS_INFORMATION child{};
-    CreateProcessW(nullptr, command.data(), nullptr, nullptr, FALSE, 0, nullptr, nullptr, &start, &child);
-    WaitForSingleObject(child.hProcess, INFINITE);
-    DWORD status = 0;
-    GetExitCodeProcess(child.hProcess, &status);
-    CloseHandle(child.hProcess), CloseHandle(child.hThread);
-    EXPECT_EQ(status, 3U) << "it ends as a process that aborts";
+    EXPECT_EQ(runInChild(L"DISABLED_BreakAnInvariant"), 3U) << "it ends as a process that aborts";
     EXPECT_NE(written().find(" press 337 67"), std::string::npos) << written();
     EXPECT_NE(written().find("\nexpect level"), std::string::npos);
 }

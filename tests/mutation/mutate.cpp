@@ -17,13 +17,15 @@ namespace {
 constexpr double goal = 0.92;
 constexpr const char* timeLimit = "timeout -k 1 30 ";
 
+constexpr const char* visits = "quabble-visit";
+
 // The test programs that see the code of a folder, the quickest tests first, each with a filter.
 using Tests = std::vector<std::pair<std::string, std::string>>;
 const std::map<std::string, Tests> testsOf{
-    {"engine", {{"engine_tests", "-Rules*"}, {"engine_tests", "*"}, {"app_tests", "*"}}},
-    {"app", {{"app_tests", "*"}}},
+    {"engine", {{"engine_tests", "-Rules*"}, {"engine_tests", "*"}, {visits, ""}, {"app_tests", "*"}}},
+    {"app", {{visits, ""}, {"app_tests", "*"}}},
     {"registry", {{"registry_tests", "*"}, {"store_tests", "*"}}},
-    {"store", {{"store_tests", "*"}, {"app_tests", "*"}, {"hosts_desktop_tests", "*"}}},
+    {"store", {{"store_tests", "*"}, {visits, ""}, {"app_tests", "*"}, {"hosts_desktop_tests", "*"}}},
     {"hosts", {{"hosts_desktop_tests", "-Crash*"}, {"hosts_desktop_tests", "Crash*"}}},
 };
 
@@ -130,8 +132,10 @@ Verdict judge(const std::string& build, const Tests& tests) {
     for (const auto& [program, filter] : tests) {
         if (!run("cmake --build " + build + " -j2 --target " + program))
             return DoesNotCompile;
-        if (!run(timeLimit + build + "/bin/" + program + " --gtest_fail_fast '--gtest_filter=" + filter +
-                 "'"))
+        const std::string words = program == visits
+                                      ? " --files " + build + "/bin " + build + "/../tests/visits/*.visit"
+                                      : " --gtest_fail_fast '--gtest_filter=" + filter + "'";
+        if (!run(timeLimit + build + "/bin/" + program + words))
             return Killed;
     }
     return Survived;
