@@ -84,6 +84,14 @@ std::string GameScreen::waitingRowInWords() const {
     return fillText(spoken::waitingRow, {"|1", revealed_ + 1, "|2", cells});
 }
 
+// What the first of several cells that are drawn alike tells of all of them.
+void GameScreen::sayOf(CellPosition place, std::int16_t tile) {
+    if (tile == tiles::explosion.front())
+        say(fillText(spoken::explosion, {"|1", blockWords(app_.game.grid.at(place).colour)}));
+    else if (tile == tiles::releasedStone)
+        say(spoken::release);
+}
+
 void GameScreen::say(std::string_view words) {
     loop_.frontEnd().say(words);
 }
@@ -164,12 +172,15 @@ void GameScreen::drawPlayPanel() {
 
 void GameScreen::drawBoard() {
     points_.reset();
+    drawnTile_ = -1;
     quabble::drawBoard(window_.canvas(), boardBox_, sprites(), app_.game.grid);
 }
 
 void GameScreen::drawCell(CellPosition place, std::int16_t tile) {
     quabble::drawCell(window_.canvas(), boardBox_, sprites(), static_cast<std::int16_t>(place.column - 1),
                       static_cast<std::int16_t>(place.row - 1), tile);
+    if (std::exchange(drawnTile_, tile) != tile)
+        sayOf(place, tile);
 }
 
 void GameScreen::drawPoints(CellPosition place, std::int32_t points) {

@@ -81,6 +81,7 @@ class GameScreen final : public Stage {
     void drawValues();
     std::string rowsInWords() const;
     std::string waitingRowInWords() const;
+    void sayOf(CellPosition place, std::int16_t tile);
     void say(std::string_view words);
 
     MessageLoop& loop_;
@@ -111,6 +112,7 @@ class GameScreen final : public Stage {
     std::int16_t revealed_ = 0;     // of the waiting row
     double percentage_ = 0;         // of the gauge
     std::optional<Points> points_;  // on the board, until it is drawn again
+    std::int16_t drawnTile_ = -1;   // the last one that was drawn on the board by itself, likewise
 
     ButtonPanel standardBtns_;
     ButtonPanel arcadeBtns_;

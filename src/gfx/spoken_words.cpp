@@ -32,12 +32,16 @@ ClusterSizes clusterSizesOf(PlayGrid grid) {
 
 }  // namespace
 
+std::string_view blockWords(std::int16_t colour) {
+    return spoken::blocks.at(static_cast<std::size_t>(colour - 1));
+}
+
 std::string wordsFor(const GridCell& cell) {
     if (cell.isEmpty())
         return std::string(spoken::empty);
     if (cell.kind == CellKind::Stone)
         return std::string(spoken::stone);
-    const std::string_view block = spoken::blocks[static_cast<std::size_t>(cell.colour - 1)];
+    const std::string_view block = blockWords(cell.colour);
     return cell.kind == CellKind::Bomb ? fillText(spoken::bomb, {"|1", block}) : std::string(block);
 }
 
@@ -64,6 +68,12 @@ std::vector<Place> textPlaces(const Rect& area, std::string_view text) {
         places.push_back(
             {area, Place::Role::Text, std::string(line.substr(0, line.find_last_not_of(blank) + 1))});
         at = end;
+    }
+    const auto count = static_cast<std::int32_t>(places.size());
+    for (std::int32_t i = 0; i < count; ++i) {
+        Rect& part = places[static_cast<std::size_t>(i)].area;
+        part.top = area.top + area.height() * i / count;
+        part.bottom = area.top + area.height() * (i + 1) / count;
     }
     return places;
 }

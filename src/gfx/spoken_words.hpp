@@ -30,21 +30,24 @@ constexpr std::string_view waitingRow = "Waiting row, |1 of 12 uncovered: |2";
 constexpr std::string_view bringRow = "Bring the waiting row";
 
 constexpr std::string_view points = "|1 points";
+constexpr std::string_view explosion = "Every |1 explodes";
+constexpr std::string_view release = "Stones are let go";
 constexpr std::string_view level = "Level |1";
 constexpr std::string_view place = "Place |1 in the table";
-constexpr std::string_view tableRow = "|1. |2, |3";
+constexpr std::string_view scoresCleared = "Scores cleared";
 
 }  // namespace quabble::spoken
 
 namespace quabble {
 
-// A cell without its place, as "coral disc".
+// A block of a colour, 1 to 4, as "coral disc", and any cell without its place.
+std::string_view blockWords(std::int16_t colour);
 std::string wordsFor(const GridCell& cell);
 
 // Every cell of the board, row by row.
 std::vector<Place> boardPlaces(const CellBox& box, const PlayGrid& grid);
 
-// The lines of a text that is written in an area.
+// The lines of a text that is written in an area, each in a part of it.
 std::vector<Place> textPlaces(const Rect& area, std::string_view text);
 
 }  // namespace quabble

@@ -9,8 +9,8 @@
 
 namespace quabble {
 
-// Something that a window's picture shows, in words. The arrow keys go to all but what is only to be read,
-// and a click in the middle of the area must mean something.
+// Something that a window's picture shows, in words. Texts and rows of a table are only there to be read; to
+// all others the arrow keys go, and a click in the middle of their areas must mean something.
 struct Place {
     enum class Role : std::uint8_t { Text, TableRow, Button, Link, Cell, TextField };
     Rect area;
@@ -31,7 +31,7 @@ struct EditedText {
 
 // A window in words, for those who do not see it.
 struct Description {
-    std::string name;  // of the screen that it shows
+    std::string name;  // of the screen that it shows, Windows-1252
     std::vector<Place> places;
     std::optional<std::size_t> current;  // the place that the ring or the focus is at
     std::optional<EditedText> edited;    // of the text field that has the focus

@@ -6,6 +6,7 @@
 #include <ranges>
 #include <utility>
 
+#include "draw/windows_1252.hpp"
 #include "platform/places.hpp"
 
 namespace quabble {
@@ -339,6 +340,10 @@ std::optional<Rect> Window::ringedPlace() const {
     if (!isRingShown_)
         return std::nullopt;
     return placeAt(placesInReach(), pointer());
+}
+
+std::string Window::screenName() const {
+    return windows1252Of(traits_.caption);
 }
 
 Description Window::describe() const {

@@ -75,7 +75,7 @@ class Window {
     void setFocus(Control* control);
 
     // What is shown, by a window that has several screens; Windows-1252.
-    virtual std::string screenName() const { return traits_.caption; }
+    virtual std::string screenName() const;
     // Whether the picture has something there that is to be clicked: the pointer is a hand above it.
     virtual bool isClickable(float /*x*/, float /*y*/) const { return false; }
     // What its picture shows, controls left out.

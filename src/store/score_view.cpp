@@ -3,7 +3,6 @@
 #include <string>
 
 #include "base/round_half_even.hpp"
-#include "gfx/message_template.hpp"
 #include "gfx/painters.hpp"
 #include "gfx/spoken_words.hpp"
 #include "gfx/string_table.hpp"
@@ -104,7 +103,7 @@ std::vector<Place> ScoreView::places() const {
         const auto i = static_cast<std::size_t>(place);
         places.push_back(
             {rowArea(place), Place::Role::TableRow,
-             fillText(spoken::tableRow, {"|1", place + 1, "|2", table.names[i], "|3", table.scores[i]})});
+             std::to_string(place + 1) + ". " + table.names[i] + ", " + std::to_string(table.scores[i])});
     }
     for (std::size_t i = 0; i < buttons_.size(); ++i)
         places.push_back({buttons_[i].rect(), Place::Role::Button, std::string(captionOf(i))});
@@ -145,6 +144,7 @@ void ScoreView::clearScores() {
     isHighlighted_ = {};
     Form_Paint();
     refresh();
+    loop().frontEnd().say(spoken::scoresCleared);
 }
 
 }  // namespace quabble
