@@ -19,7 +19,7 @@ namespace {
 std::unique_ptr<Running> running;
 std::string text;  // what the page hands over
 
-constexpr std::string_view keyThatAsks = "F2";  // how it stands
+constexpr std::string_view keyThatAsksHowItStands = "F2";
 
 WindowId idOf(std::uint32_t window) {
     return static_cast<WindowId>(window);
@@ -85,8 +85,9 @@ QUABBLE_EXPORT(pressCloseButton) void pressCloseButton(std::uint32_t window) {
 // the browser.
 QUABBLE_EXPORT(pressKey)
 bool pressKey(std::uint32_t window, bool shift, bool ctrl, bool alt, bool altGraph, bool isRepeated) {
-    if (text == keyThatAsks) {
-        running->frontEnd.sayTexts(idOf(window));
+    if (text == keyThatAsksHowItStands && !shift && !ctrl && !alt) {
+        if (!isRepeated)
+            running->frontEnd.sayHowItStands(idOf(window));
         return true;
     }
     auto event = translate({.key = text,

@@ -3,6 +3,8 @@
 #include <cstddef>
 #include <cstdint>
 
+#include "platform/front_end.hpp"
+
 #define QUABBLE_PAGE(name) __attribute__((import_module("page"), import_name(name)))
 
 // What the page does for the program: functions of its script, in page/program.js. Texts are UTF-8, sizes and
@@ -12,36 +14,36 @@ namespace quabble::page {
 QUABBLE_PAGE("now") double now();
 
 QUABBLE_PAGE("createWindow")
-void createWindow(std::uint32_t window, std::uint32_t owner, bool isBorderless, const char* caption,
+void createWindow(WindowId window, WindowId owner, bool isBorderless, const char* caption,
                   std::size_t captionSize);
 // The frame's place in the page, and in the frame the client area's.
 QUABBLE_PAGE("placeWindow")
-void placeWindow(std::uint32_t window, std::int32_t left, std::int32_t top, std::int32_t width,
+void placeWindow(WindowId window, std::int32_t left, std::int32_t top, std::int32_t width,
                  std::int32_t height, std::int32_t clientLeft, std::int32_t clientTop,
                  std::int32_t clientWidth, std::int32_t clientHeight);
 // A picture of the client area, at whatever scale: red, green, blue and 255 for each pixel.
 QUABBLE_PAGE("showPixels")
-void showPixels(std::uint32_t window, std::int32_t width, std::int32_t height, const std::uint32_t* pixels);
-QUABBLE_PAGE("closeWindow") void closeWindow(std::uint32_t window);
-QUABBLE_PAGE("minimiseWindow") void minimiseWindow(std::uint32_t window);
-QUABBLE_PAGE("setPointer") void setPointer(std::uint32_t window, bool isHand);
+void showPixels(WindowId window, std::int32_t width, std::int32_t height, const std::uint32_t* pixels);
+QUABBLE_PAGE("closeWindow") void closeWindow(WindowId window);
+QUABBLE_PAGE("minimiseWindow") void minimiseWindow(WindowId window);
+QUABBLE_PAGE("setPointer") void setPointer(WindowId window, bool isHand);
 // Without a width there is no text field.
 QUABBLE_PAGE("setTextField")
-void setTextField(std::uint32_t window, std::int32_t left, std::int32_t top, std::int32_t width,
+void setTextField(WindowId window, std::int32_t left, std::int32_t top, std::int32_t width,
                   std::int32_t height);
 
 // What is read beside a window's picture; places are counted from 0, sizes in percent of the client area.
-QUABBLE_PAGE("nameScreen") void nameScreen(std::uint32_t window, const char* name, std::size_t nameSize);
-QUABBLE_PAGE("clearPlaces") void clearPlaces(std::uint32_t window);
+QUABBLE_PAGE("nameScreen") void nameScreen(WindowId window, const char* name, std::size_t nameSize);
+QUABBLE_PAGE("clearPlaces") void clearPlaces(WindowId window);
 // A place for the first time since they were cleared, or its new words. The role is one of Place::Role.
 QUABBLE_PAGE("setPlace")
-void setPlace(std::uint32_t window, std::size_t place, std::uint32_t role, double left, double top,
-              double width, double height, const char* words, std::size_t wordsSize);
+void setPlace(WindowId window, std::size_t place, std::uint32_t role, double left, double top, double width,
+              double height, const char* words, std::size_t wordsSize);
 // The place that the keyboard is at; -1 for none.
-QUABBLE_PAGE("setCurrentPlace") void setCurrentPlace(std::uint32_t window, std::int32_t place);
+QUABBLE_PAGE("setCurrentPlace") void setCurrentPlace(WindowId window, std::int32_t place);
 // What the text field is for, and what the program has in it; caret and anchor in characters.
 QUABBLE_PAGE("setFieldText")
-void setFieldText(std::uint32_t window, const char* label, std::size_t labelSize, const char* text,
+void setFieldText(WindowId window, const char* label, std::size_t labelSize, const char* text,
                   std::size_t textSize, std::size_t caret, std::size_t anchor);
 // Says it, after what is being said.
 QUABBLE_PAGE("say") void say(const char* words, std::size_t wordsSize);

@@ -17,6 +17,7 @@ struct Running {
     PageBlob blob;
     BlobRegistryStore registry{blob};
     Program program;
+    WindowId windowTold = WindowId::none;
     std::uint64_t picturesTold = 0;
 
     Running(const Page& page, std::uint64_t seed) : frontEnd(page), program(frontEnd, registry, seed) {
@@ -26,8 +27,9 @@ struct Running {
     // What has become of the pictures is told in words, too.
     void tell() {
         const Window* window = program.topmostWindow();
-        if (window == nullptr || picturesTold == program.picturesShown())
+        if (window == nullptr || (windowTold == window->id() && picturesTold == program.picturesShown()))
             return;
+        windowTold = window->id();
         picturesTold = program.picturesShown();
         frontEnd.tell(window->id(), window->describe());
     }

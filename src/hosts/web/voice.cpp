@@ -10,10 +10,6 @@
 namespace quabble {
 namespace {
 
-std::uint32_t number(WindowId window) {
-    return static_cast<std::uint32_t>(window);
-}
-
 void add(std::string& text, std::string_view sentence) {
     if (sentence.empty())
         return;
@@ -43,7 +39,8 @@ void Voice::tell(WindowId window, bool isDialog, Size clientSize, const Descript
     const bool hadFocus = std::exchange(focused_, window) == window;
     const Description before = std::exchange(told_[window], now);
     if (before.name != now.name) {
-        page::nameScreen(number(window), now.name.data(), now.name.size());
+        const std::string name = utf8Of(now.name);
+        page::nameScreen(window, name.data(), name.size());
         if (hadFocus) {
             const std::string others = std::exchange(said_, now.name);
             add(said_, others);
@@ -51,15 +48,15 @@ void Voice::tell(WindowId window, bool isDialog, Size clientSize, const Descript
     }
     tellPlaces(window, clientSize, before.places, now.places);
     if (isNew || before.current != now.current)
-        page::setCurrentPlace(number(window), now.current ? static_cast<std::int32_t>(*now.current) : -1);
+        page::setCurrentPlace(window, now.current ? static_cast<std::int32_t>(*now.current) : -1);
     if (now.edited && before.edited != now.edited) {
         const std::string label = now.current ? utf8Of(now.places[*now.current].words) : "";
         const std::string text = utf8Of(now.edited->text);
-        page::setFieldText(number(window), label.data(), label.size(), text.data(), text.size(),
-                           now.edited->caret, now.edited->anchor);
+        page::setFieldText(window, label.data(), label.size(), text.data(), text.size(), now.edited->caret,
+                           now.edited->anchor);
     }
     if (isNew && isDialog)
-        add(said_, textsOf(now));
+        add(said_, textsOf(now, Place::Role::Text));
     sayNow(std::exchange(said_, {}));
 }
 
@@ -67,7 +64,7 @@ void Voice::tellPlaces(WindowId window, Size clientSize, const std::vector<Place
                        const std::vector<Place>& now) const {
     const bool isLaidAnew = !std::ranges::equal(before, now, isLaidAlike);
     if (isLaidAnew)
-        page::clearPlaces(number(window));
+        page::clearPlaces(window);
     for (std::size_t i = 0; i < now.size(); ++i) {
         const Place& place = now[i];
         if (!isLaidAnew && before[i].words == place.words)
@@ -75,25 +72,29 @@ void Voice::tellPlaces(WindowId window, Size clientSize, const std::vector<Place
         const std::string words = utf8Of(place.words);
         const auto across = [&](std::int32_t x) { return 100.0 * x / clientSize.width; };
         const auto down = [&](std::int32_t y) { return 100.0 * y / clientSize.height; };
-        page::setPlace(number(window), i, static_cast<std::uint32_t>(place.role), across(place.area.left),
+        page::setPlace(window, i, static_cast<std::uint32_t>(place.role), across(place.area.left),
                        down(place.area.top), across(place.area.width()), down(place.area.height()),
                        words.data(), words.size());
     }
 }
 
-std::string Voice::textsOf(const Description& description) {
+std::string Voice::textsOf(const Description& description, Place::Role role) {
     std::string texts;
     for (const Place& place : description.places) {
-        if (place.role == Place::Role::Text)
+        if (place.role == role)
             add(texts, place.words);
     }
     return texts;
 }
 
-void Voice::sayTexts(WindowId window) const {
+void Voice::sayHowItStands(WindowId window) const {
     const auto found = told_.find(window);
-    if (found != told_.end())
-        sayNow(textsOf(found->second));
+    if (found == told_.end())
+        return;
+    std::string words = found->second.name;
+    add(words, textsOf(found->second, Place::Role::Text));
+    add(words, textsOf(found->second, Place::Role::TableRow));
+    sayNow(words);
 }
 
 Point Voice::middleOf(WindowId window, std::size_t place) const {

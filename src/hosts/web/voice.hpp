@@ -23,8 +23,8 @@ class Voice {
 
     void close(WindowId window) { told_.erase(window); }
 
-    // Says the texts of the window again, for somebody who asks.
-    void sayTexts(WindowId window) const;
+    // For somebody who asks: the screen, and all texts and rows of a table on it.
+    void sayHowItStands(WindowId window) const;
 
     // The middle of one of the places of the window, by its number; outside the window when there is none.
     Point middleOf(WindowId window, std::size_t place) const;
@@ -32,7 +32,7 @@ class Voice {
  private:
     void tellPlaces(WindowId window, Size clientSize, const std::vector<Place>& before,
                     const std::vector<Place>& now) const;
-    static std::string textsOf(const Description& description);
+    static std::string textsOf(const Description& description, Place::Role role);
 
     std::map<WindowId, Description> told_;
     WindowId focused_ = WindowId::none;

@@ -12,10 +12,6 @@
 namespace quabble {
 namespace {
 
-std::uint32_t number(WindowId window) {
-    return static_cast<std::uint32_t>(window);
-}
-
 FileBytes pageFile(std::string_view name) {
     FileBytes bytes(page::fileSize(name.data(), name.size()));
     page::take(bytes.data());
@@ -36,8 +32,7 @@ Scale WebFrontEnd::wantedScale() const {
 }
 
 Scale WebFrontEnd::createWindow(WindowId window, const NativeWindow& traits) {
-    page::createWindow(number(window), number(traits.owner), traits.borderless, traits.caption.data(),
-                       traits.caption.size());
+    page::createWindow(window, traits.owner, traits.borderless, traits.caption.data(), traits.caption.size());
     Shown& shown = windows_[window];
     shown.traits = traits;
     place(window, shown);
@@ -52,19 +47,19 @@ void WebFrontEnd::place(WindowId window, Shown& shown) {
     shown.place = placeOn(page_, shown.traits, factorOn(page_), around);
     const Rect& frame = shown.place.frame;
     const Rect& client = shown.place.client;
-    page::placeWindow(number(window), frame.left, frame.top, frame.width(), frame.height(), client.left,
-                      client.top, client.width(), client.height());
+    page::placeWindow(window, frame.left, frame.top, frame.width(), frame.height(), client.left, client.top,
+                      client.width(), client.height());
     placeTextField(window, shown);
 }
 
 void WebFrontEnd::showPixels(WindowId window, const Surface& picture) {
-    page::showPixels(number(window), picture.width(), picture.height(), picture.row(0).data());
+    page::showPixels(window, picture.width(), picture.height(), picture.row(0).data());
 }
 
 void WebFrontEnd::closeWindow(WindowId window) {
     windows_.erase(window);
     voice_.close(window);
-    page::closeWindow(number(window));
+    page::closeWindow(window);
 }
 
 // Owners come before their dialogs.
@@ -86,7 +81,7 @@ void WebFrontEnd::takeLargePictures() {
 }
 
 void WebFrontEnd::minimiseWindow(WindowId window) {
-    page::minimiseWindow(number(window));
+    page::minimiseWindow(window);
     setMinimised(window, true);
 }
 
@@ -150,7 +145,7 @@ void WebFrontEnd::releaseMouse(WindowId window, Point at) {
 }
 
 void WebFrontEnd::setPointer(WindowId window, PointerShape shape) {
-    page::setPointer(number(window), shape == PointerShape::Hand);
+    page::setPointer(window, shape == PointerShape::Hand);
 }
 
 // --- Text ---
@@ -163,7 +158,7 @@ void WebFrontEnd::setTextInput(WindowId window, std::optional<Rect> area) {
 
 void WebFrontEnd::placeTextField(WindowId window, const Shown& shown) {
     if (!shown.textArea) {
-        page::setTextField(number(window), 0, 0, 0, 0);
+        page::setTextField(window, 0, 0, 0, 0);
         return;
     }
     const Rect& client = shown.place.client;
@@ -172,7 +167,7 @@ void WebFrontEnd::placeTextField(WindowId window, const Shown& shown) {
     const auto down = [&](std::int32_t y) { return y * client.height() / size.height; };
     const Rect area{across(shown.textArea->left), down(shown.textArea->top), across(shown.textArea->right),
                     down(shown.textArea->bottom)};
-    page::setTextField(number(window), area.left, area.top, area.width(), area.height());
+    page::setTextField(window, area.left, area.top, area.width(), area.height());
 }
 
 bool WebFrontEnd::editsText(WindowId window) const {

@@ -53,8 +53,8 @@ class WebFrontEnd final : public FrontEnd {
     void tell(WindowId window, const Description& description);
     // Somebody has chosen one of the places that the page was told of.
     void clickPlace(WindowId window, std::size_t place);
-    // Somebody asks how it stands.
-    void sayTexts(WindowId window) const { voice_.sayTexts(window); }
+    // Somebody asks.
+    void sayHowItStands(WindowId window) const { voice_.sayHowItStands(window); }
 
     // --- FrontEnd ---
 

@@ -73,6 +73,10 @@ export default {
     await visit.cameTo('type rgen');
     await visit.tab.keyboard.press('Backspace');
     await visit.cameTo(backspace);
+    // A keyboard on a screen takes up the letters before the caret again.
+    await session.send('Input.imeSetComposition', {text: 'r', selectionStart: 1, selectionEnd: 1, replacementStart: 3, replacementEnd: 6});
+    await session.send('Input.insertText', {text: 'rs'});
+    await visit.cameTo(backspace, backspace, backspace, 'type rs');
     visit.compare();
     await visit.close();
   },

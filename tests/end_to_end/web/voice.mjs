@@ -14,7 +14,8 @@ class Listener {
     await visit.see(() => {
       window.heard = [];
       const said = document.querySelector('[aria-live=polite]');
-      new MutationObserver(() => window.heard.push(said.textContent)).observe(said, {childList: true});
+      const hear = (changes) => changes.forEach(({addedNodes}) => addedNodes.forEach((words) => window.heard.push(words.textContent)));
+      new MutationObserver(hear).observe(said, {childList: true});
     });
     return listener;
   }
@@ -148,12 +149,41 @@ export default {
     expect((await player.heard()) === 'Row 1 of 48', 'It is not said that a row has come.');
     await visit.tab.keyboard.press('F2');
     const status = await player.heard();
-    expect(/^Score 0\. Best score 0\. Level 1\. Row 1 of 48\. Waiting row, \d+ of 12 uncovered: (\w[a-z ]+(, |$)){12}$/.test(status), `Asked how it stands it says "${status}".`);
+    expect(/^Timed game\. Score 0\. Best score 0\. Level 1\. Row 1 of 48\. Waiting row, \d+ of 12 uncovered: (\w[a-z ]+(, |$)){12}$/.test(status), `Asked how it stands it says "${status}".`);
     await choose('Pause');
     expect((await player.heard()) === 'Game paused', 'The pause is not said.');
     expect(await visit.see(() => document.querySelectorAll('[role=gridcell]').length === 0), 'The board can be read while it is hidden.');
     await choose('Game Paused Click here to continue');
     expect((await player.heard()) === 'Timed game', 'The end of the pause is not said.');
+    await visit.close();
+  },
+
+  'a bomb, a row that follows a move and a table that is cleared are told of': async (browser) => {
+    const visit = await Visit.open(browser, site.address);
+    const player = await Listener.at(visit);
+    const choose = (pattern) => visit.see((pattern) => {
+      const place = [...document.querySelectorAll('.spoken [role]')].find((place) => new RegExp(pattern).test(place.ariaLabel));
+      place?.click();
+      return place !== undefined;
+    }, pattern);
+    await choose('Strategy Game');
+    for (let rows = 0; !(await choose(': bomb')); ++rows) {
+      expect(rows < 11, 'There is no bomb.');
+      await choose('Bring the waiting row');
+    }
+    await visit.atRest();
+    const heard = await player.heard();
+    expect(/\| Every (coral disc|mint diamond|amber star) explodes(\.| \|)/.test(heard), `Of a bomb is heard "${heard}".`);
+    expect(/\| Row \d+ of 48$/.test(heard), `Of the row after it is heard "${heard}".`);
+    await choose('End game');
+    await visit.untilWindow('Game Statistics');
+    await visit.tab.keyboard.press('Enter');
+    await until('menu', async () => (await visit.captions()).length === 1);
+    await choose('High scores - Timed');
+    await visit.untilWindow('Best Scores - Quabble');
+    await player.heard();
+    await choose('Clear Scores');
+    expect((await player.heard()) === 'Scores cleared', 'A table is cleared without a word.');
     await visit.close();
   },
 

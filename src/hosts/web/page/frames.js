@@ -56,10 +56,7 @@ export class Frames {
     const frame = document.createElement('section');
     frame.className = 'frame';
     frame.ariaLabel = caption;
-    if (owner !== 0) {
-      frame.role = 'dialog';
-      frame.ariaModal = 'true';
-    }
+    if (owner !== 0) frame.role = 'dialog';
     const canvas = document.createElement('canvas');
     canvas.ariaHidden = 'true';
     const spoken = new Spoken(window, owner !== 0, (place) => this.#program.call('clickPlace', window, place));
@@ -67,7 +64,7 @@ export class Frames {
     const bar = isBorderless ? null : this.#makeBar(window, owner, caption);
     frame.append(...(bar === null ? [] : [bar]), canvas, spoken.element);
     this.#windows.set(window, {frame, bar, canvas, paint, spoken, field: null, owner, caption, client: []});
-    this.#listen(window, frame, canvas);
+    this.#listen(window, frame, spoken.element);
     this.#desk.append(frame);
     this.#letOneTakeInput();
   }
@@ -180,6 +177,7 @@ export class Frames {
     button.addEventListener('click', () => {
       button.remove();
       shown.frame.hidden = false;
+      layRecordButton(shown.frame);
       focus(shown);
       this.#program.call('setMinimised', window, false);
     });
@@ -190,7 +188,7 @@ export class Frames {
   /** @param {number} window @param {boolean} isHand */
   setPointer(window, isHand) {
     const shown = this.#windows.get(window);
-    if (shown !== undefined) shown.canvas.style.cursor = isHand ? 'pointer' : 'default';
+    if (shown !== undefined) shown.spoken.element.style.cursor = isHand ? 'pointer' : 'default';
   }
 
   // --- Input ---
@@ -199,12 +197,12 @@ export class Frames {
    * A touch is a click when it ends, for it may become a pinch; it has no hover, so the pointer moves there first.
    * @param {number} window
    * @param {HTMLElement} frame
-   * @param {HTMLCanvasElement} canvas
+   * @param {HTMLElement} surface where the pointer is felt
    */
-  #listen(window, frame, canvas) {
+  #listen(window, frame, surface) {
     /** @param {PointerEvent} event */
     const placeOf = (event) => {
-      const area = canvas.getBoundingClientRect();
+      const area = surface.getBoundingClientRect();
       const client = this.#windows.get(window)?.client ?? [0, 0, 0, 0];
       return [
         Math.floor(((event.clientX - area.left) * client[2]) / area.width),
@@ -216,24 +214,24 @@ export class Frames {
       this.#program.call('moveMouse', window, ...placeOf(event));
       this.#program.call('pressMouse', window, ...placeOf(event), event.shiftKey);
     };
-    canvas.addEventListener('pointerdown', (event) => {
+    surface.addEventListener('pointerdown', (event) => {
       if (event.pointerType === 'touch' || event.button > 2) return;
-      canvas.setPointerCapture(event.pointerId);
+      surface.setPointerCapture(event.pointerId);
       press(event);
     });
-    canvas.addEventListener('pointermove', (event) => {
+    surface.addEventListener('pointermove', (event) => {
       if (event.pointerType !== 'touch') this.#program.call('moveMouse', window, ...placeOf(event));
     });
-    canvas.addEventListener('pointerup', (event) => {
+    surface.addEventListener('pointerup', (event) => {
       if (event.pointerType === 'touch') press(event);
       this.#program.call('releaseMouse', window, ...placeOf(event));
     });
-    canvas.addEventListener('mousedown', (event) => {
+    surface.addEventListener('mousedown', (event) => {
       event.preventDefault(); // the keyboard stays where it is, or goes to the text field
       const shown = this.#windows.get(window);
       if (shown !== undefined) focus(shown);
     });
-    canvas.addEventListener('contextmenu', (event) => event.preventDefault());
+    surface.addEventListener('contextmenu', (event) => event.preventDefault());
     frame.addEventListener('keydown', (event) => this.#pressKey(window, event));
   }
 
@@ -245,7 +243,8 @@ export class Frames {
     const isTaken = this.#program.callWithText(
       key, 'pressKey', window, shiftKey, ctrlKey || metaKey, altKey, altGraph, repeat);
     const isTyped = event.target instanceof HTMLInputElement && [...key].length === 1 && !ctrlKey && !metaKey;
-    if (isTaken && !isTyped) event.preventDefault();
+    const isForBrowser = isTaken === 0; // no key is, once the program has failed
+    if (!isForBrowser && !isTyped) event.preventDefault();
   }
 
   // --- Text ---

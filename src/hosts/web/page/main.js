@@ -69,7 +69,7 @@ async function play() {
     end: () =>
       showEnd(keeping.isKept ? 'Quabble has ended. Settings and high scores are kept.'
                      : 'Quabble has ended. Settings and high scores could not be kept.'),
-    fail: (reason) => fail(reason, keeping.isKept),
+    fail: (reason, isAllKept) => fail(reason, isAllKept && keeping.isKept),
     closed: keep, // a name may have been entered, which is not to be lost when something goes wrong later
     open,
   });

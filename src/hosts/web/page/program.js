@@ -23,7 +23,7 @@ export class Program {
   /**
    * @param {Files} files
    * @param {Keeping} keeping
-   * @param {{end: () => void, fail: (reason: unknown) => void, closed: () => void, open: (document: string) => void}} page
+   * @param {{end: () => void, fail: (reason: unknown, isAllKept: boolean) => void, closed: () => void, open: (document: string) => void}} page
    */
   constructor(files, keeping, page) {
     this.files = files;
@@ -64,7 +64,7 @@ export class Program {
     } catch (error) {
       this.#isOver = true;
       clearTimeout(this.#alarm);
-      this.page.fail(error);
+      this.page.fail(error, !this.#hasClosedDialog);
       return undefined;
     }
   }

@@ -1,16 +1,18 @@
 // What is read of a window by those who do not see its picture. It lies over the picture, each place where it is seen, so
-// that a finger finds it too; it is not seen itself, and the pointer does not notice it.
+// that a finger finds it too, and is not seen itself.
 
 const keysHint = 'Arrow keys move, Control and Enter click, F2 says how it stands';
 
 /** The program's roles of places, in its order. */
 const roles = ['text', 'row', 'button', 'link', 'gridcell', 'field'];
 const cellsInRow = 12;
+const sentencesKept = 4;
 
 export class Spoken {
   /** @type {HTMLElement[]} */
   #places = [];
   #window;
+  #isDialog;
   #grid = /** @type {HTMLElement | null} */ (null);
   #cells = 0;
   /** Everything; a region of the page, or what a dialog has inside. */
@@ -25,23 +27,25 @@ export class Spoken {
    */
   constructor(window, isDialog, choose) {
     this.#window = window;
+    this.#isDialog = isDialog;
     this.element = document.createElement(isDialog ? 'div' : 'section');
     this.element.className = 'spoken';
     this.keyboard.role = 'application';
     this.keyboard.tabIndex = 0;
     this.keyboard.ariaLabel = 'Quabble';
-    this.keyboard.setAttribute('aria-description', keysHint);
+    if (!isDialog) this.keyboard.setAttribute('aria-description', keysHint);
     this.element.append(this.keyboard);
     this.element.addEventListener('click', (event) => {
-      const place = this.#places.indexOf(/** @type {HTMLElement} */ (event.target));
-      if (place >= 0) choose(place);
+      const target = /** @type {HTMLElement} */ (event.target);
+      const place = this.#places.indexOf(target);
+      const isByPointer = /** @type {MouseEvent} */ (event).detail > 0; // which the frame has listened to
+      if (place >= 0 && target.role !== null && !isByPointer) choose(place);
     });
   }
 
   /** @param {string} name */
   nameScreen(name) {
-    if (this.element instanceof HTMLDivElement) return; // a dialog has its name from its frame
-    this.element.ariaLabel = name;
+    if (!this.#isDialog) this.element.ariaLabel = name; // a dialog has its name from its frame
   }
 
   clear() {
@@ -101,9 +105,11 @@ export class Spoken {
   }
 }
 
-/** Says it politely: after what is being said. The same words are said again when they come again. @param {string} words */
+/** Says it politely: after what is being said, for which the sentences before stay a while. @param {string} words */
 export function say(words) {
+  const said = /** @type {HTMLElement} */ (document.getElementById('said'));
   const sentence = document.createElement('p');
   sentence.textContent = words;
-  document.getElementById('said')?.replaceChildren(sentence);
+  said.append(sentence);
+  if (said.childElementCount > sentencesKept) said.firstElementChild?.remove();
 }

@@ -10,6 +10,7 @@ export class TextField {
   #text = '';
   #selection = [0, 0];
   #half = ''; // of a character that Firefox reports in two halves
+  #takenUp = ''; // the word that a composition began with
 
   /**
    * @param {number} window
@@ -22,13 +23,14 @@ export class TextField {
     Object.assign(field, {type: 'text', autocomplete: 'off', spellcheck: false, enterKeyHint: 'done'});
     field.setAttribute('autocorrect', 'off');
     field.addEventListener('beforeinput', (event) => this.#input(event));
-    field.addEventListener('compositionstart', () => {
-      field.value = '';
+    field.addEventListener('compositionstart', (event) => {
+      this.#takenUp = event.data;
       field.classList.add('composing');
     });
     field.addEventListener('compositionend', (event) => {
       field.classList.remove('composing');
       this.#show();
+      this.#remove(this.#takenUp);
       this.#type(event.data);
     });
     for (const act of /** @type {const} */ (['copy', 'cut'])) {
@@ -65,9 +67,22 @@ export class TextField {
   #input(event) {
     if (event.isComposing || event.inputType === 'insertCompositionText') return;
     event.preventDefault();
-    if (event.inputType === 'deleteContentBackward')
-      this.#program.callWithText('Backspace', 'pressKey', this.#window, false, false, false, false, false);
-    else if (event.inputType !== 'insertLineBreak') this.#type(event.data);
+    if (event.inputType === 'deleteContentBackward') this.#press('Backspace');
+    else if (!['insertLineBreak', 'insertReplacementText'].includes(event.inputType)) this.#type(event.data);
+  }
+
+  /** Takes away a word that the caret is in or behind: keyboards on a screen take such a word up again. @param {string} word */
+  #remove(word) {
+    const [caret, anchor] = this.#selection;
+    const start = this.#text.indexOf(word, Math.max(0, caret - word.length));
+    if (word === '' || caret !== anchor || start < 0 || start > caret) return; // what is marked goes by itself
+    for (let at = caret; at < start + word.length; ++at) this.#press('ArrowRight');
+    for (let at = 0; at < word.length; ++at) this.#press('Backspace');
+  }
+
+  /** @param {string} key */
+  #press(key) {
+    this.#program.callWithText(key, 'pressKey', this.#window, false, false, false, false, false);
   }
 
   /** @param {string | null} text */
