@@ -81,7 +81,7 @@ Win32Window::Win32Window(WindowId id, const NativeWindow& traits, const Win32Win
     setTextInput(std::nullopt);
     if (above != nullptr)
         EnableWindow(above, FALSE);
-    else if (!traits.borderless)
+    if (!traits.borderless)
         addToMenu(handle_);
 }
 
