@@ -70,7 +70,7 @@ mkdirSync(site, {recursive: true});
 const icon = (width) => readFileSync(join(filesFolder, `icon_${width}.png`));
 
 const siteLinks = [
-  ...['program', 'pictures'].map((name) => `<link rel="preload" href="${name}.data" as="fetch" crossorigin>`),
+  ...['program', 'pictures'].map((name) => `<link rel="preload" href="${name}.data" as="fetch" crossorigin fetchpriority="low">`),
   '<link rel="manifest" href="manifest.webmanifest">', '<link rel="icon" href="icon_192.png">',
 ];
 const siteFiles = {

@@ -52,7 +52,16 @@ function open(document) {
   window.open(isInside ? `${location.href.split('#')[0]}#help` : document, '_blank', 'noopener');
 }
 
+/** What is seen first is not held up by what comes after it. Where nobody looks no frame comes, and none is waited for. */
+async function splashIsSeen() {
+  const splash = /** @type {HTMLImageElement} */ (document.getElementById('splash'));
+  if (document.hidden) return;
+  await splash.decode().catch(console.warn);
+  await new Promise((seen) => requestAnimationFrame(() => setTimeout(seen)));
+}
+
 async function play() {
+  await splashIsSeen();
   const keeping = new Keeping();
   const isOpened = keeping.open();
   const [module, files, picture] = await Promise.all([loadProgram(), filesOf('pictures'), backdrop()]);
