@@ -4,6 +4,7 @@
 #include <unistd.h>
 
 #include <csignal>
+#include <cstdio>
 #include <utility>
 
 namespace quabble {
@@ -27,7 +28,8 @@ extern "C" void noteUserSignal(int) {
 
 }  // namespace
 
-VisitFile::VisitFile(const Program& program, std::string path) : program_(program), path_(std::move(path)) {
+VisitFile::VisitFile(const Program& program, std::string path)
+    : program_(program), path_(std::move(path)), unfinishedPath_(path_ + ".new") {
     current() = this;
     std::signal(SIGUSR1, noteUserSignal);
     std::signal(SIGABRT, &VisitFile::onAbort);
@@ -55,16 +57,19 @@ void VisitFile::onAbort(int) {
     std::raise(SIGABRT);
 }
 
-// A file that cannot be written is as good as none: there is nobody to tell.
+// Where it cannot be written whole an older one stays: there is nobody to tell.
 void VisitFile::write() const {
     const int file =
-        ::open(path_.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC | O_NONBLOCK, userOnlyFile);
+        ::open(unfinishedPath_.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC | O_NONBLOCK, userOnlyFile);
     if (file < 0)
         return;
-    program_.writeVisit([file](std::string_view line) {
-        [[maybe_unused]] const auto written = ::write(file, line.data(), line.size());
+    bool isWhole = true;
+    program_.writeVisit([&](std::string_view line) {
+        isWhole = isWhole && ::write(file, line.data(), line.size()) == static_cast<ssize_t>(line.size());
     });
-    ::close(file);
+    isWhole = ::close(file) == 0 && isWhole;
+    if (!isWhole || std::rename(unfinishedPath_.c_str(), path_.c_str()) != 0)
+        ::unlink(unfinishedPath_.c_str());
 }
 
 }  // namespace quabble

@@ -25,6 +25,7 @@ class VisitFile {
 
     const Program& program_;
     std::string path_;
+    std::string unfinishedPath_;
 };
 
 }  // namespace quabble
